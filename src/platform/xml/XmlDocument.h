@@ -1,0 +1,100 @@
+#pragma once
+
+#include "platform/Error.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace pugi {
+class xml_document;
+class xml_node;
+struct xml_node_struct;
+} // namespace pugi
+
+/// The XML document object model that callers were written for, on pugixml. Stricter than the library:
+/// exactly one root element with nothing but comments and white space behind it, no attribute twice,
+/// no document type with entities; only the five predefined entities and numeric references expand.
+/// At most 64 MiB of text and 512 levels; more is a parse error.
+namespace tovimar {
+
+/// What the parser said. Code 0 means no error; lines and positions count from 1, file position from 0.
+struct XmlParseReport {
+    ResultCode errorCode = 0;
+    std::string reason;
+    std::int32_t filepos = 0;
+    std::int32_t line = 0;
+    std::int32_t linepos = 0;
+    std::string srcText; ///< the line of the error, at most 200 bytes
+    std::string url;     ///< path of the file, native; empty for text
+};
+
+/// A node handle: cheap to copy, empty handles answer with nothing, valid while its document lives.
+class XmlNode {
+public:
+    XmlNode() = default;
+    explicit operator bool() const { return node_ != nullptr; }
+
+    bool IsElement() const;
+    bool IsComment() const;
+    /// Tag name with its prefix; "#comment", "#text".
+    std::string nodeName() const;
+    /// Tag name without its prefix.
+    std::string baseName() const;
+    XmlNode parent() const;
+    XmlNode firstChild() const;
+    std::vector<XmlNode> childNodes() const;
+    std::vector<XmlNode> childElements() const;
+
+    /// Exact comparison, as the model has it. None when absent.
+    std::optional<std::string> getAttribute(std::string_view name) const;
+    std::string attribute(std::string_view name, std::string_view absent = {}) const;
+    std::size_t attributeCount() const;
+    /// 0-based, in the order of the source.
+    std::string attributeName(std::size_t index) const;
+    std::string attributeValue(std::size_t index) const;
+    void setAttributeValue(std::size_t index, std::string_view value);
+    void setAttribute(std::string_view name, std::string_view value);
+
+    /// All text below the node.
+    std::string text() const;
+    /// The node as markup, no indentation added.
+    std::string xml() const;
+
+    /// XPath below this node; "//" starts at the document.
+    XmlNode selectSingleNode(std::string_view xpath) const;
+    std::vector<XmlNode> selectNodes(std::string_view xpath) const;
+
+private:
+    friend class XmlDocument;
+    explicit XmlNode(pugi::xml_node_struct* node) : node_(node) {}
+    pugi::xml_node_struct* node_ = nullptr;
+};
+
+class XmlDocument {
+public:
+    XmlDocument();
+    ~XmlDocument();
+    XmlDocument(XmlDocument&&) noexcept;
+    XmlDocument& operator=(XmlDocument&&) noexcept;
+
+    /// False on a parse error or a missing file; `parseError` says why. A Windows path.
+    bool load(const std::string& path);
+    /// Text with or without a declaration; it is UTF-8 whatever the declaration says.
+    bool loadXML(std::string_view text);
+    const XmlParseReport& parseError() const { return report_; }
+
+    XmlNode documentElement() const;
+    XmlNode selectSingleNode(std::string_view xpath) const;
+    std::vector<XmlNode> selectNodes(std::string_view xpath) const;
+    std::string xml() const;
+
+private:
+    bool Parse(std::string_view text);
+    std::unique_ptr<pugi::xml_document> document_;
+    XmlParseReport report_;
+};
+
+} // namespace tovimar
