@@ -1,0 +1,74 @@
+#include "SyntheticApplication.h"
+
+#include <fstream>
+#include <sstream>
+#include <string>
+
+namespace tovimar::bench {
+namespace {
+
+void Write(const std::filesystem::path& path, const std::string& text) {
+    std::filesystem::create_directories(path.parent_path());
+    std::ofstream(path, std::ios::binary) << text;
+}
+
+std::string Place(int left, int top, int width, int height) {
+    std::ostringstream out;
+    out << "                    Left =" << left << "\r\n                    Top =" << top
+        << "\r\n                    Width =" << width << "\r\n                    Height =" << height << "\r\n";
+    return out.str();
+}
+
+/// A text box with its attached label, as the host nests them.
+std::string LabelledBox(int index) {
+    const int top = 120 + index / 2 * 420;
+    const int left = index % 2 * 5400 + 120;
+    const std::string number = std::to_string(index);
+    return "                Begin TextBox\r\n" + Place(left + 1800, top, 3000, 300) +
+           "                    Name =\"txtField" + number + "\"\r\n                    ControlSource =\"Field" +
+           number + "\"\r\n                    StatusBarText =\"What field " + number +
+           " is for\"\r\n                    Begin\r\n                        Begin Label\r\n" +
+           Place(left, top, 1700, 300) + "                            Name =\"lblField" + number +
+           "\"\r\n                            Caption =\"Field &" + number +
+           ":\"\r\n                        End\r\n                    End\r\n                End\r\n";
+}
+
+std::string Design(const std::string& kind, int number) {
+    const std::string name = std::to_string(number);
+    std::string text = "Version =21\r\nVersionRequired =20\r\nBegin " + kind + "\r\n    Width =11000\r\n" +
+                       "    RecordSource =\"tbl" + name + "\"\r\n    Caption =\"" + kind + " number " + name +
+                       "\"\r\n    Begin\r\n        Begin Label\r\n            FontSize =9\r\n            FontName "
+                       "=\"Calibri\"\r\n        End\r\n        Begin TextBox\r\n            FontSize =9\r\n       "
+                       "     FontName =\"Calibri\"\r\n        End\r\n        Begin Section\r\n            Height "
+                       "=5400\r\n            Name =\"Detail\"\r\n            Begin\r\n";
+    for (int i = 0; i < 24; ++i)
+        text += LabelledBox(i);
+    return text + "            End\r\n        End\r\n    End\r\nEnd\r\n";
+}
+
+} // namespace
+
+void WriteSyntheticApplication(const std::filesystem::path& folder, int objects) {
+    for (int i = 0; i < objects; ++i) {
+        const std::string name = std::to_string(i);
+        switch (i % 10) {
+        case 6:
+        case 7:
+            Write(folder / "reports" / ("rpt" + name + ".report"), Design("Report", i));
+            break;
+        case 8:
+            Write(folder / "tbldefs" / ("tbl" + name + ".sql"),
+                  "CREATE TABLE [tbl" + name + "] (\r\n  [ID] AUTOINCREMENT CONSTRAINT [PrimaryKey] PRIMARY KEY,\r\n"
+                  "  [Name] VARCHAR (50),\r\n  [Price] CURRENCY\r\n)\r\n");
+            break;
+        case 9:
+            Write(folder / "queries" / ("qry" + name + ".sql"),
+                  "SELECT ID, Name, Price * 2 AS Twice\r\nFROM tbl" + std::to_string(i - 1) + ";\r\n");
+            break;
+        default:
+            Write(folder / "forms" / ("frm" + name + ".form"), Design("Form", i));
+        }
+    }
+}
+
+} // namespace tovimar::bench
