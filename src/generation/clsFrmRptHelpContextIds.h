@@ -1,0 +1,50 @@
+#pragma once
+
+#include "platform/KeyedList.h"
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace tovimar {
+
+class CXmlControl;
+class CXmlForm;
+
+/// Help context ids of a run: which are in use, new ones for objects and controls that have none, the numbers
+/// written back into the source application, and the include file of the help project. 0 means no id.
+class clsFrmRptHelpContextIds {
+public:
+    /// Forgets objects, used ids and duplicates; the last number given out stays.
+    void Reset();
+    void Terminate() { Reset(); }
+
+    /// Takes over the ids of an object and its controls, or of one control's children; an object counts once.
+    void ExtractUsedHelpContextIds(const CXmlForm& rxmlForm, const CXmlControl* rxmlControl = nullptr);
+    /// Gives ids to what has none, in the saved definitions.
+    void AssignHelpContextIds();
+    /// Writes new ids into the source's objects, where that is asked for, and the include file.
+    void SetHelpContextIds();
+
+    /// Next free number in steps of ten, 0 when none was found.
+    std::int32_t NextFreeId(bool vfReserve);
+    bool IsFormKnown(const std::string& name) const { return forms_.Contains(name); }
+    bool IsIdUsed(std::int32_t id) const { return usedIds_.Contains(std::to_string(id)); }
+    /// "form*control*id" per id that was met again.
+    const std::vector<std::string>& Duplicates() const { return duplicates_; }
+
+private:
+    void AddUsedId(std::int32_t id, const std::string& form, const std::string& control);
+    void AssignHelpContextIdsForForm(const std::string& name);
+    void AssignHelpContextIdsForSubControls(CXmlControl& control);
+    std::string SetHelpContextIdsForForm(const std::string& name);
+    std::string DefinitionPath(const std::string& name) const;
+    void WriteIncludeFile(std::string text);
+
+    KeyedList<std::string> forms_;
+    KeyedList<std::int32_t> usedIds_;
+    std::vector<std::string> duplicates_;
+    std::int32_t lastId_ = 0;
+};
+
+} // namespace tovimar
