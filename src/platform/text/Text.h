@@ -76,6 +76,7 @@ public:
 
 private:
     int number_;
+    const struct CodePageTable* table_; // kept for the life of the process
 };
 
 /// The process's ANSI code page: what "plain text" files are read and written in. 1252 at start;

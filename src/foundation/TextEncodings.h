@@ -1,0 +1,25 @@
+#pragma once
+
+#include <string>
+
+/// Escaping of texts for XML attributes and HTML, and back. All are linear in the text.
+///
+/// Both encoders keep plain letters, digits and most punctuation and write everything else as `&#n;`, where n
+/// is the character's value in the ANSI code page, or its code point when the page doesn't have it. An
+/// entity that already stands in the text isn't encoded again.
+namespace tovimar {
+
+/// For settings and catalogue. `vfCyrillicAsEntity` writes Russian letters as numbers too. Entities are
+/// copied as they are.
+std::string EncodeSpecialChars(const std::string& text, bool vfCyrillicAsEntity = false);
+
+/// For definitions and topics. Named entities become their numeric form; ";" stays.
+std::string EncodeXmlText(const std::string& text, bool rfCyrillicAsEntity = false);
+
+/// Entities become characters: first every "&amp;", then all named ones, then the numeric ones. Names are
+/// looked up as written, then without regard to case. Numbers 128 to 159 are taken from the ANSI code page.
+std::string DecodeHtmlEntities(const std::string& text);
+/// The same, for captions read back from topics.
+std::string DecodeEntities(const std::string& text);
+
+} // namespace tovimar
