@@ -56,18 +56,32 @@ struct OpenObject {
 
     FrameInput FrameSettings() const;
     /// Heights of sections 0 to 4 as they are shown in this view: a hidden section, a page section in form
-    /// view, and header and footer of a datasheet are absent.
+    /// view, and header and footer of a datasheet are absent. The detail of a continuous form counts all
+    /// records shown, so that its footer's controls lie below the last of them.
     SectionHeights Sections(const SystemMetrics& metrics) const;
+    /// Records shown below each other: 1 but in the form view of a continuous form.
+    int ShownRecords() const;
 };
+
+/// The controls that are columns of a form's datasheet, from the left: rising `ColumnOrder`, equal ones as
+/// they stand in the design.
+std::vector<const DesignObject*> DatasheetColumns(const Design& design);
+/// Width of a column in twips; an inch where the design leaves it to the host, 0 for a hidden column.
+std::int32_t DatasheetColumnWidth(const DesignObject& control);
 
 /// Client area that shows the whole object in its view, so that nothing is cut off: in form view the
 /// sections with record selector, scroll bars and navigation buttons, in design view the design surface,
-/// in preview a sheet of paper. A form's own window size counts where it is larger.
+/// in preview a sheet of paper. A form's own window size counts where it is larger and the form doesn't
+/// fit its window to its content (`AutoResize`).
 void SetInitialSize(OpenObject& object, const SystemMetrics& metrics);
 
 /// The window of an open object; it reads the object when it is captured, so the object must outlive it.
 /// Class "OForm" or "OReport"; caption the object's caption, in design view name and kind.
 std::unique_ptr<Window> MakeObjectWindow(const OpenObject& object, const SystemMetrics& metrics);
+
+/// The page area of a report in preview, class "OPrtPrevPage": the window above without its frame. Open it
+/// below the report's window, with its handle as `parent`. Reads the object as the window above does.
+std::unique_ptr<Window> MakePreviewPageWindow(const OpenObject& object, const SystemMetrics& metrics);
 
 /// The relationships of the database as a picture of table boxes joined by lines; class "OSysRel".
 struct RelationshipTable {

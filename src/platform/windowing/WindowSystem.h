@@ -39,6 +39,9 @@ public:
     virtual ~Window() = default;
     /// The whole window, frame included; a bitmap of Width x Height of its rectangle.
     virtual Bitmap Paint() = 0;
+    /// Brings caption and rectangles up to date with what the window shows; True when a picture painted
+    /// before is out of date. Asked before the window is handed out or captured.
+    virtual bool Refresh() { return false; }
 
     WindowHandle handle = 0;
     WindowHandle parent = 0;
