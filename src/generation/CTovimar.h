@@ -4,9 +4,9 @@
 #include "platform/Error.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <string>
-#include <vector>
 
 namespace tovimar {
 
@@ -74,10 +74,25 @@ public:
                                                      const std::string& htmlFullPath, bool vfPreviewAreaOnly,
                                                      const std::string& sourceTypeName, bool vfKeepOpened);
 
+    /// Shows the help editor on the tree; none in a program without windows, which then asks nothing about
+    /// it.
+    std::function<void()> OpenHelpEditor;
+    /// What the help compiler of the last run printed, and its exit code; empty and 0 when it didn't run.
+    std::string CompilerOutput;
+    int CompilerExitCode = 0;
+
     /// Once only: ends the help context ids and the tree.
     void Terminate();
 
 private:
+    struct RunPaths;
+    void CompleteGeneration(RunPaths& paths, bool vfSaveChanges, bool vfOpenHelp, int& step);
+    void OfferEditorAfterErrors();
+    void OpenEditor();
+    ResultCode CompileAndCopy();
+    ResultCode LoadProjectFile(const std::string& path, bool newProject);
+    void LoadNewProject(bool hasPaths);
+
     std::unique_ptr<CTovimarParameters> parameters_;
     std::unique_ptr<clsHHK> helpIndex_;
     std::unique_ptr<CHelpPrjTree> tree_;

@@ -1,11 +1,9 @@
 #pragma once
 
 #include <cstdint>
-#include <functional>
 #include <memory>
 #include <string>
 #include <utility>
-#include <vector>
 
 namespace tovimar {
 
@@ -81,7 +79,7 @@ public:
     std::string FolderForGeneratedHelp() const;
     void SetFolderForGeneratedHelp(const std::string& value) { folderForGeneratedHelp_ = value; }
     std::string FolderForGeneratedImages() const;
-    /// Never empty: "images" stands in. Stored with a trailing backslash.
+    /// Without a trailing backslash; never empty, "images" stands in.
     std::string NameOfFolderForGeneratedImages() const;
     std::string NameOfFolderForGeneratedImagesWithSlash() const;
     void SetNameOfFolderForGeneratedImages(const std::string& value);
@@ -112,8 +110,5 @@ private:
     std::string helpProjectName_;
     std::string helpProjectTitle_;
 };
-
-/// "Tovimar Add-In v." and the version text behind it: major, point, minor, revision, build date.
-std::string TovimarVersionText();
 
 } // namespace tovimar
