@@ -8,6 +8,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace tovimar {
 
@@ -42,6 +43,7 @@ public:
     void AppendXml(std::string& out) const;
 
 private:
+    void ReadMarkedAnchor(const std::vector<std::string>& parts);
     ResultCode SplitAnchorName(const std::string& fullName, const std::string& formName);
 };
 

@@ -23,9 +23,11 @@ public:
     /// The same over the topic's text.
     ResultCode ParseText(std::string_view html);
     /// The reader of anchors.
-    void Parse1(std::string_view vstrBuf, const std::string& vstrFormName, const std::string& vstrExcludeList);
+    void Parse1(std::string_view vstrBuf, const std::string& vstrFormName,
+                const std::string& vstrExcludeList);
     /// The reader of headings.
-    void Parse2(std::string_view vstrBuf, const std::string& vstrFormName, const std::string& vstrExcludeList);
+    void Parse2(std::string_view vstrBuf, const std::string& vstrFormName,
+                const std::string& vstrExcludeList);
 
     /// Value of a meta element by its name; empty when absent.
     static std::string MetaValue(std::string_view html, std::string_view name);

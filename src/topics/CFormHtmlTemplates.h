@@ -30,7 +30,8 @@ public:
     std::string ControlArea(const std::string& vstrFrmName, const CXmlForm& rfrm, const CXmlControl& rctl,
                             const CXmlControl* rctlParent, bool IsTabArea);
     /// Empty when the picture isn't on the disk.
-    std::string MainImage(const CXmlForm& robjXmlForm, bool vfUseLocalImagePath, const std::string& vstrPicsDir);
+    std::string MainImage(const CXmlForm& robjXmlForm, bool vfUseLocalImagePath,
+                          const std::string& vstrPicsDir);
     std::string ControlImage(const CXmlForm& robjXmlForm, const CXmlControl& robjXmlControl,
                              bool vfUseLocalImagePath, const std::string& vstrPicsDir);
     std::string MenusList(const CXmlForm& robjXmlForm);
@@ -46,7 +47,8 @@ public:
     /// Anchors of sections: the form's prefix, "_", the control's or entry's.
     std::string BookmarkName(const CXmlForm& rxmlForm, const CXmlControl& rxmlControl);
     std::string BookmarkNameForMenu(const CXmlForm& rxmlForm, const CXmlMenu& rxmlMenu);
-    std::string BookmarkNameForDocumentedMenuOrControl(const CXmlForm& rxmlForm, const CFormHTMLControlDef& robj);
+    std::string BookmarkNameForDocumentedMenuOrControl(const CXmlForm& rxmlForm,
+                                                       const CFormHTMLControlDef& robj);
 
     /// The meta element of a charset; empty for none.
     std::string Charset(const std::string& vstrCharset);

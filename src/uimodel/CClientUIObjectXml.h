@@ -15,8 +15,8 @@ class CClientUIObjectXml {
 public:
     /// The adjusted definition, empty on a reported failure. `lngPicType` 2 gives jpg pictures, any other
     /// bmp. `vstrPicSubFolder` is put before the names of the containers' own pictures as it stands.
-    std::string Adjust(const std::string& vstrUIObjectXml, std::int32_t vlngObjectType, bool vfCompIsInDesignView,
-                       std::int32_t lngPicType, const std::string& vstrPicFullPath,
+    std::string Adjust(const std::string& vstrUIObjectXml, std::int32_t vlngObjectType,
+                       bool vfCompIsInDesignView, std::int32_t lngPicType, const std::string& vstrPicFullPath,
                        const std::string& vstrHtmlFullPath, const std::string& vstrPicSubFolder,
                        bool vfControlLocationIsAbsolute);
 

@@ -36,17 +36,17 @@ public:
     std::int32_t TabIndexInRow(std::int32_t vlngTabIdx) const;
     std::int32_t TabsQTy() const { return tabsQty_; }
     std::int32_t TabsPerRow() const { return tabsPerRow_; }
-    std::int32_t TabLeft(std::int32_t vlngTabIdx);
-    std::int32_t TabTop(std::int32_t vlngTabIdx);
-    std::int32_t TabWidth(std::int32_t vlngTabIdx);
-    std::int32_t TabHeight(std::int32_t vlngTabIdx);
+    std::int32_t TabLeft(std::int32_t vlngTabIdx) const;
+    std::int32_t TabTop(std::int32_t vlngTabIdx) const;
+    std::int32_t TabWidth(std::int32_t vlngTabIdx) const;
+    std::int32_t TabHeight(std::int32_t vlngTabIdx) const;
 
     /// Twips per unit of the host.
     double ConstToMultiplyX() const { return constX_; }
     double ConstToMultiplyY() const { return constY_; }
 
 private:
-    void ReadOnAccess(IClientFormProcessor& processor);
+    void ReadOnAccess();
     void ReadElsewhere(bool addContainers);
     void AddContainers();
     void CalcTabsOnAccess();

@@ -10,7 +10,7 @@
 #include <memory>
 #include <optional>
 #include <string>
-#include <unordered_set>
+#include <unordered_map>
 
 namespace tovimar {
 
@@ -43,6 +43,8 @@ public:
     std::string ParentControlName;
     std::optional<CXmlParseError> XmlParseError;
     bool HasCaption = false;
+    /// The attribute `Caption` as it was read; raw definitions have it beside `Text`. Never written.
+    std::string HostCaption;
     /// Rectangle of a tab page's tab; -1 in `TabLeft` means none.
     std::int32_t TabLeft = -1;
     std::int32_t TabTop = -1;
@@ -101,10 +103,10 @@ public:
     std::int32_t HotSpotRight(bool vfNoClientAreaOffset = false) const;
     std::int32_t HotSpotBottom(bool vfNoClientAreaOffset = false) const;
     /// The same of a tab page's tab.
-    std::int32_t TabHotSpotLeft() const { return TabLeft + ClientAreaOffsetX(); }
-    std::int32_t TabHotSpotTop() const { return TabTop + ClientAreaOffsetY(); }
-    std::int32_t TabHotSpotRight() const { return TabHotSpotLeft() + TabWidth; }
-    std::int32_t TabHotSpotBottom() const { return TabHotSpotTop() + TabHeight; }
+    std::int32_t TabHotSpotLeft() const;
+    std::int32_t TabHotSpotTop() const;
+    std::int32_t TabHotSpotRight() const;
+    std::int32_t TabHotSpotBottom() const;
 
     /// By name without regard to case: "Name", "BookmarkName", "Text", "Width", "Height", "Top", "Left",
     /// "TabIndex", "Visible", "Index", "HelpContextId", "ClassName", "OriginalClassName", "TabPageTab",
@@ -123,15 +125,13 @@ public:
     /// Drops the tree below and the way up. A second call does nothing.
     void Terminate();
 
-    /// Names used so far, folded.
-    using UsedNames = std::unordered_set<std::string>;
+    /// Names used so far, folded, with the last number tried behind each.
+    using UsedNames = std::unordered_map<std::string, std::int32_t>;
     /// Gives each control of the tree a bookmark that is unique without regard to case: the name, else the
     /// name and a number from 1 to 1000.
     static void AssignControlsBookmarkNames(List& rcolControls, UsedNames& rcolTest);
     /// The list in the order of the tab index, equal ones as they stood; sorts the children as well.
     static void SortList(List& controls);
-    /// Adds under `key`, and while that is taken under the key with one more "_".
-    static void AddWithFreeKey(List& list, std::unique_ptr<CXmlControl> control, std::string key);
 
 private:
     void ReadAttributes(const XmlNode& node, CAddInProject* project);

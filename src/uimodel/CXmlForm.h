@@ -131,12 +131,14 @@ public:
 
     /// Renders the topic of a form or report, writes it unless the path is empty, gives 0 or the number of
     /// a reported failure, and reads the documented lists back.
-    ResultCode SaveHTMLEx(const std::string& htmlFileFullPath, bool HtmlOfReport, bool vfApplyZoomFactor = false,
-                          bool vfUseLocalImagePath = true, const std::string& vstrPicsDir = {});
+    ResultCode SaveHTMLEx(const std::string& htmlFileFullPath, bool HtmlOfReport,
+                          bool vfApplyZoomFactor = false, bool vfUseLocalImagePath = true,
+                          const std::string& vstrPicsDir = {});
     /// The same of a table, query or macro; the template is `vstrHtmlFileName`.
     ResultCode SaveHTML4Table(const std::string& htmlFileFullPath, const std::string& vstrHtmlFileName,
-                              bool HtmlOfReport, bool vfApplyZoomFactor = false, bool vfUseLocalImagePath = true,
-                              const std::string& vstrPicsDir = {}, const std::string& vstrQryXml = {});
+                              bool HtmlOfReport, bool vfApplyZoomFactor = false,
+                              bool vfUseLocalImagePath = true, const std::string& vstrPicsDir = {},
+                              const std::string& vstrQryXml = {});
     /// The same of a worksheet or chart, with its contents.
     ResultCode SaveHTML4Worksheet(const std::string& htmlFileFullPath, const std::string& vstrHtmlFileName,
                                   bool HtmlOfReport, bool vfApplyZoomFactor = false,
@@ -150,21 +152,21 @@ public:
 
 private:
     struct Rendering;
-    ResultCode Render(const Rendering& rendering);
+    ResultCode Render(const char* operation, const Rendering& rendering);
     std::string RenderText(const Rendering& rendering);
     ResultCode TakeReport(const XmlDocument& document);
     void ReadRoot(const XmlNode& root, CAddInProject* project);
-    void ReadPaths(const XmlNode& root, CAddInProject* project);
     void ReadSizes(const XmlNode& root);
     ResultCode ReadChildren(const XmlNode& root, CAddInProject* project);
-    template <typename T> ResultCode AddChild(KeyedList<std::unique_ptr<T>>& list, std::unique_ptr<T> child,
-                                              ResultCode parsed);
     ResultCode ReadDocumented(const XmlNode& root);
+    ResultCode ReadItems(const XmlNode& documented, const char* listName, DefList& list);
     ResultCode TakeDefs(CFormHTMLControlDefs& defs, bool keepTheSame);
-    void AppendAttributes(std::string& out);
-    void AppendSizes(std::string& out) const;
+    void FillIndexes();
+    void AppendAttributes(std::string& out) const;
     void AppendOrigin(std::string& out) const;
+    void AppendDocumented(std::string& out) const;
     const CXmlSection* Section(const std::string& name) const;
+    void EnsureIndex() const;
 
     std::string picFullPath_;
     std::string htmlFullPath_;

@@ -15,13 +15,16 @@ class IClientFormProcessor;
 /// of the last form are kept until `Forget`: whoever opens, resizes or closes a form calls it.
 class clsAccFormDimensions {
 public:
-    std::int32_t FormClientAreaOffsetX(IClientFormProcessor& processor, const HostObject& form, bool vfRulerOn);
-    std::int32_t FormClientAreaOffsetY(IClientFormProcessor& processor, const HostObject& form, bool vfRulerOn);
+    std::int32_t FormClientAreaOffsetX(IClientFormProcessor& processor, const HostObject& form,
+                                       bool vfRulerOn);
+    std::int32_t FormClientAreaOffsetY(IClientFormProcessor& processor, const HostObject& form,
+                                       bool vfRulerOn);
     /// Of the form that the control stands on; the form itself will do.
     std::int32_t FormRecordSelectorWidth(IClientFormProcessor& processor, const HostObject& control,
                                          bool vfRulerOn);
     /// "Detail", "Header", "Footer", "PageHeader", "PageFooter"; empty for another section.
-    std::string ControlSectionName(IClientFormProcessor& processor, const HostObject& control, bool vfRulerOn);
+    std::string ControlSectionName(IClientFormProcessor& processor, const HostObject& control,
+                                   bool vfRulerOn);
     std::int32_t ControlSectionOffsetX(IClientFormProcessor& processor, const HostObject& control,
                                        bool vfRulerOn);
     std::int32_t ControlSectionOffsetY(IClientFormProcessor& processor, const HostObject& control,
@@ -46,29 +49,22 @@ public:
     /// Drops what is kept of the last form.
     void Forget();
 
-private:
-    friend class CScaler;
+    /// What is known of a form.
     struct Answer {
         platform::access::View view = platform::access::View::Design;
         platform::access::Frame frame;
         platform::access::SectionHeights heights;
     };
     const Answer& Of(const HostObject& form, bool vfRulerOn);
+    /// Of the form that the control stands on.
     const Answer& OfControl(const HostObject& control, bool vfRulerOn);
+    /// What `TabRectangle` reads of a tab control.
+    static platform::access::TabInput ReadTabs(const HostObject& tabControl);
 
+private:
     HostObject form_; ///< keeps the identity from being used anew
     bool rulerOn_ = false;
     Answer answer_;
 };
-
-/// Reads of host properties with failures switched off.
-namespace HostProperty {
-std::int32_t Integer(const HostObject& object, const char* name, std::int32_t absent = 0);
-double Number(const HostObject& object, const char* name, double absent = 0);
-bool Flag(const HostObject& object, const char* name);
-std::string Text(const HostObject& object, const char* name);
-HostObject Object(const HostObject& object, const char* name, const AutomationObject::Arguments& arguments = {});
-bool Readable(const HostObject& object, const char* name);
-} // namespace HostProperty
 
 } // namespace tovimar

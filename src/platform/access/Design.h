@@ -45,11 +45,14 @@ public:
 
     /// The property here, else in the prototype; null when neither has it.
     const PropertyValue* Find(std::string_view property) const;
+    /// The property here; the prototype isn't asked.
+    const PropertyValue* FindOwn(std::string_view property) const;
 
     /// The effective value: own, prototype, built-in default of the kind (`BuiltInDefault`), `absent`.
     std::int32_t Integer(std::string_view property, std::int32_t absent = 0) const;
     std::string Text(std::string_view property, std::string_view absent = {}) const;
-    /// "NotDefault" is the opposite of the built-in default.
+    /// "NotDefault" is the opposite of what would be inherited: of the prototype's value, else of the
+    /// built-in default.
     bool Flag(std::string_view property) const;
 
     bool Is(std::string_view typeName) const; ///< ignoring case

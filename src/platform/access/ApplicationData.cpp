@@ -1,0 +1,231 @@
+#include "platform/Environment.h"
+#include "platform/Error.h"
+#include "platform/access/ApplicationModel.h"
+#include "platform/access/ExportReader.h"
+#include "platform/access/QueryReader.h"
+#include "platform/access/TableReader.h"
+#include "platform/files/Paths.h"
+#include "platform/text/Text.h"
+
+#include <algorithm>
+
+/// The data side of the application: tables, queries, and the records behind forms.
+namespace tovimar::platform::access {
+
+namespace {
+
+constexpr int kMaxQueryDepth = 8;
+
+std::string ReadText(const std::string& path) {
+    return DecodeExportText(Env().files->ReadFile(path));
+}
+
+Records::Type RecordType(FieldType type) {
+    switch (type) {
+    case FieldType::Boolean:
+        return Records::Type::Boolean;
+    case FieldType::Currency:
+        return Records::Type::Currency;
+    case FieldType::Date:
+        return Records::Type::DateTime;
+    case FieldType::Text:
+    case FieldType::Guid:
+        return Records::Type::Text;
+    case FieldType::Memo:
+        return Records::Type::Memo;
+    case FieldType::Binary:
+    case FieldType::LongBinary:
+    case FieldType::Attachment:
+        return Records::Type::Binary;
+    default:
+        return Records::Type::Number;
+    }
+}
+
+bool IsStatement(const std::string& source) {
+    for (const auto* word : {"SELECT", "PARAMETERS", "TRANSFORM", "("})
+        if (text::StartsWithIgnoringCase(source, word))
+            return true;
+    return false;
+}
+
+/// Names with or without brackets, a statement with or without its final semicolon.
+std::string CleanSource(const std::string& source) {
+    auto clean = text::TrimWhitespace(source);
+    while (clean.ends_with(';'))
+        clean = text::TrimWhitespace(clean.substr(0, clean.size() - 1));
+    const bool bracketed = clean.size() > 2 && clean.starts_with('[') && clean.find(']') == clean.size() - 1;
+    return bracketed ? clean.substr(1, clean.size() - 2) : clean;
+}
+
+/// Cells of data files take the types of the table's fields.
+void TakeTypes(const TableDefinition& table, Records& records) {
+    for (auto& column : records.columns)
+        for (const auto& field : table.fields)
+            if (text::EqualsIgnoringCase(field.name, column.name))
+                column.type = RecordType(field.type);
+}
+
+void TakeFields(const Records& records, TableDefinition& table) {
+    for (const auto& column : records.columns) {
+        FieldDefinition field;
+        field.name = column.name;
+        table.fields.push_back(std::move(field));
+    }
+}
+
+} // namespace
+
+ApplicationModel::Table& ApplicationModel::TableNamed(const std::string& name) {
+    if (auto* known = tables_.Find(name))
+        return **known;
+    tables_.Add(std::make_unique<Table>(), name);
+    auto& table = **tables_.Find(name);
+    table.definition.name = name;
+    return table;
+}
+
+void ApplicationModel::LoadTable(Table& table) {
+    if (table.loaded)
+        return;
+    table.loaded = true;
+    const auto name = table.definition.name;
+    auto& definition = table.definition;
+    if (!table.sqlPath.empty())
+        definition = ReadTableSql(ReadText(table.sqlPath), name);
+    else if (!table.linkPath.empty())
+        definition = ReadLinkedTable(ReadText(table.linkPath), name, Env().files->ToNative(table.linkPath));
+    definition.name = name;
+    if (!table.schemaPath.empty())
+        MergeTableSchema(ReadText(table.schemaPath), Env().files->ToNative(table.schemaPath), definition);
+    if (definition.fields.empty() && !table.dataPath.empty())
+        TakeFields(ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), 1), definition);
+}
+
+void ApplicationModel::LoadQuery(Query& query) {
+    if (query.loaded)
+        return;
+    query.loaded = true;
+    const auto name = query.definition.name;
+    const auto source = ReadText(query.path);
+    const bool isExport = RecognizeExport(source) == ExportContent::Query;
+    query.definition = isExport ? ReadQueryExport(source, Env().files->ToNative(query.path)) : ParseQuerySql(source);
+    query.definition.name = name;
+}
+
+const TableDefinition* ApplicationModel::FindTable(const std::string& name) {
+    auto* table = tables_.Find(name);
+    if (!table)
+        return nullptr;
+    LoadTable(**table);
+    return &(*table)->definition;
+}
+
+const QueryDefinition* ApplicationModel::FindQuery(const std::string& name) {
+    auto* query = queries_.Find(name);
+    if (!query)
+        return nullptr;
+    LoadQuery(**query);
+    return &(*query)->definition;
+}
+
+const std::vector<FieldDefinition>& ApplicationModel::QueryFields(const std::string& name) {
+    static const std::vector<FieldDefinition> kNone;
+    auto* found = queries_.Find(name);
+    if (!found)
+        return kNone;
+    auto& query = **found;
+    LoadQuery(query);
+    if (!query.resolved) {
+        const FieldSources sources{[this](const std::string& table) { return FindTable(table); },
+                                   [this](const std::string& other) { return FindQuery(other); }};
+        query.fields = ResolveQueryFields(query.definition, sources);
+        query.resolved = true;
+    }
+    return query.fields;
+}
+
+const Records* ApplicationModel::FindRecords(const std::string& recordSource, int rows) {
+    const auto source = CleanSource(recordSource);
+    if (source.empty())
+        return nullptr;
+    const auto key = text::FoldCase(source) + "\n" + std::to_string(rows);
+    const auto known = records_.find(key);
+    if (known != records_.end())
+        return known->second.get();
+    auto& kept = records_[key];
+    try {
+        auto records = std::make_unique<Records>(ReadRecords(source, rows, 0));
+        if (!records->columns.empty())
+            kept = std::move(records);
+    } catch (const RaisedError&) {
+        kept = nullptr; // sample text stands in where the data can't be had
+    }
+    return kept.get();
+}
+
+Records ApplicationModel::ReadRecords(const std::string& source, int rows, int depth) {
+    if (auto* table = tables_.Find(source)) {
+        LoadTable(**table);
+        return TableRecords(**table, rows);
+    }
+    if (const auto* query = FindQuery(source))
+        return QueryRecords(*query, QueryFields(source), rows, depth);
+    if (!IsStatement(source))
+        return {};
+    const FieldSources sources{[this](const std::string& table) { return FindTable(table); },
+                               [this](const std::string& other) { return FindQuery(other); }};
+    const auto query = ParseQuerySql(source);
+    return QueryRecords(query, ResolveQueryFields(query, sources), rows, depth);
+}
+
+Records ApplicationModel::TableRecords(Table& table, int rows) {
+    Records records;
+    if (!table.dataPath.empty()) {
+        records = ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), rows);
+        TakeTypes(table.definition, records);
+    } else if (!table.database.empty() && table.definition.connect.empty()) {
+        records = ReadTableRecords(table.database, table.definition.name, rows);
+    }
+    if (records.columns.empty())
+        for (const auto& field : table.definition.fields)
+            records.columns.push_back({field.name, RecordType(field.type)});
+    return records;
+}
+
+/// Rows only of a query that shows one source as it is: a record that the query wouldn't show is worse
+/// than sample text.
+Records ApplicationModel::QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields,
+                                       int rows, int depth) {
+    Records records;
+    for (const auto& field : fields)
+        records.columns.push_back(
+            {field.name, field.sourceField.empty() ? Records::Type::Unknown : RecordType(field.type)});
+    if (query.filtered || query.operation != 1 || query.inputs.size() != 1 || depth >= kMaxQueryDepth)
+        return records;
+    const auto source = ReadRecords(query.inputs[0].table, rows, depth + 1);
+    for (const auto& cells : source.rows) {
+        auto& row = records.rows.emplace_back();
+        for (const auto& field : fields) {
+            auto index = source.ColumnIndex(field.sourceField);
+            if (index < 0)
+                index = source.ColumnIndex(field.name);
+            row.push_back(index < 0 ? std::string() : cells[static_cast<std::size_t>(index)]);
+        }
+    }
+    return records;
+}
+
+std::string ApplicationModel::FindPicture(const std::string& name) {
+    const auto* path = pictures_.Find(name);
+    return path && Env().files->FileExists(*path) ? Env().files->ReadFile(*path) : std::string();
+}
+
+const std::vector<std::uint32_t>& ApplicationModel::ThemeColors() {
+    // The palette "Office" that the host gives a new database.
+    static const std::vector<std::uint32_t> kOffice = {0x000000, 0xFFFFFF, 0x1F497D, 0xEEECE1, 0x4F81BD,
+                                                       0xC0504D, 0x9BBB59, 0x8064A2, 0x4BACC6, 0xF79646};
+    return kOffice;
+}
+
+} // namespace tovimar::platform::access

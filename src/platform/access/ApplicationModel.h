@@ -1,0 +1,117 @@
+#pragma once
+
+#include "platform/KeyedList.h"
+#include "platform/Value.h"
+#include "platform/access/ApplicationFolder.h"
+#include "platform/access/DatabaseReader.h"
+#include "platform/access/OpenObject.h"
+
+#include <memory>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+namespace tovimar::platform::access {
+
+/// One application as its sources give it, whatever they are. Everything is read once: names at the start,
+/// designs, definitions and records when they are first asked for.
+class ApplicationModel : public ApplicationSource {
+public:
+    /// Raises as OpenAccessApplication.
+    explicit ApplicationModel(const std::string& nativePath);
+    ~ApplicationModel() override;
+
+    const std::string& FullName() const { return fullName_; } ///< Windows path of the database, may be virtual
+    const std::string& Folder() const { return folder_; }     ///< Windows path without trailing backslash
+    /// The name of the code project.
+    std::string ProjectName();
+
+    /// Names of a kind, sorted without regard to case.
+    const std::vector<std::string>& Names(ObjectKind kind) const;
+    bool Contains(ObjectKind kind, const std::string& name) const;
+    /// The spelling in the application for a name in any case; the name itself when it is unknown.
+    std::string NameOf(ObjectKind kind, const std::string& name) const;
+
+    /// Raises 0x80040001 with the reason for an object that can't be read or of which only the name is known.
+    const Design& OpenDesign(ObjectKind kind, const std::string& name);
+    /// Empty without a reason against opening the object.
+    std::string DesignError(ObjectKind kind, const std::string& name);
+    bool DesignKnown(ObjectKind kind, const std::string& name) const;
+    /// Text of the object's export with its code, UTF-8. Raises as OpenDesign.
+    std::string ExportText(ObjectKind kind, const std::string& name);
+    /// Source of a module; none when there is no such module or its source isn't known.
+    std::optional<std::string> ModuleCode(const std::string& name);
+
+    /// Null for an unknown name. Raises 0x80040001 for a definition that can't be read.
+    const TableDefinition* FindTable(const std::string& name);
+    const QueryDefinition* FindQuery(const std::string& name);
+    const std::vector<FieldDefinition>& QueryFields(const std::string& name);
+    const std::vector<RelationDefinition>& Relations() const { return relations_; }
+
+    const Design* FindDesign(ObjectKind kind, const std::string& name) override;
+    const Records* FindRecords(const std::string& recordSource, int rows) override;
+    std::string FindPicture(const std::string& name) override;
+    const std::vector<std::uint32_t>& ThemeColors() override;
+
+    /// Values that were written to an object's properties; they last as long as the application.
+    std::unordered_map<std::string, Value>& WrittenValues(const void* object) { return written_[object]; }
+
+private:
+    struct Object {
+        std::string name;
+        std::string path;     ///< Windows path of its export, empty for a database's object
+        std::string codePath;
+        std::string database; ///< native path, for objects of a database
+        bool loaded = false;
+        std::unique_ptr<Design> design;
+        std::string error;
+    };
+    struct Table {
+        TableDefinition definition;
+        bool loaded = false;
+        std::string sqlPath, schemaPath, linkPath, dataPath;
+        std::string database;
+    };
+    struct Query {
+        QueryDefinition definition;
+        bool loaded = false;
+        std::string path;
+        std::vector<FieldDefinition> fields;
+        bool resolved = false;
+    };
+    using Objects = KeyedList<std::unique_ptr<Object>>;
+
+    void OpenDatabaseFile(const std::string& path);
+    void OpenFolder(const std::string& path);
+    void TakePart(const ApplicationPart& part);
+    void TakeRelation(const std::string& path);
+    void TakeDatabase(const std::string& path, bool topLevel);
+    void TakeDatabaseTables(DatabaseContent& content, const std::string& nativePath);
+    void SortNames();
+
+    Objects& ListOf(ObjectKind kind);
+    Object& Demand(ObjectKind kind, const std::string& name);
+    void Load(ObjectKind kind, Object& object);
+    Table& TableNamed(const std::string& name);
+    void LoadTable(Table& table);
+    void LoadQuery(Query& query);
+    Records ReadRecords(const std::string& recordSource, int rows, int depth);
+    Records TableRecords(Table& table, int rows);
+    Records QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields, int rows,
+                         int depth);
+
+    std::string fullName_;
+    std::string folder_;
+    std::string projectInfoPath_;
+    Objects forms_, reports_, macros_, modules_;
+    KeyedList<std::unique_ptr<Table>> tables_;
+    KeyedList<std::unique_ptr<Query>> queries_;
+    std::vector<RelationDefinition> relations_;
+    KeyedList<std::string> pictures_; ///< Windows paths by picture name
+    std::vector<std::string> names_[6];
+    bool kindInExports_[6] = {};
+    std::unordered_map<std::string, std::unique_ptr<Records>> records_;
+    std::unordered_map<const void*, std::unordered_map<std::string, Value>> written_;
+};
+
+} // namespace tovimar::platform::access

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "platform/access/DataModel.h"
+#include "platform/access/Design.h"
+#include "platform/access/OpenObject.h"
+
+#include <string>
+#include <utility>
+#include <vector>
+
+/// Reads .mdb and .accdb files. The reader library trusts its input, so it works in a child process with
+/// bounded time and memory: whatever a damaged file does to it ends as an error here.
+namespace tovimar::platform::access {
+
+struct DatabaseContent {
+    std::vector<TableDefinition> tables;     ///< user tables and linked ones
+    std::vector<QueryDefinition> queries;
+    std::vector<RelationDefinition> relations;
+    /// Forms, reports, macros and modules, of which the name is known.
+    std::vector<std::pair<ObjectKind, std::string>> names;
+};
+
+/// Raises 0x80040001 "<path>: <reason>" for a file that can't be read as a database.
+DatabaseContent ReadDatabase(const std::string& nativePath);
+
+/// Columns and the first records of a table; raises as ReadDatabase, and when the table is absent.
+Records ReadTableRecords(const std::string& nativePath, const std::string& table, int rows);
+
+} // namespace tovimar::platform::access

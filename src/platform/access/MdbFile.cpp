@@ -1,0 +1,196 @@
+#include "platform/access/MdbFile.h"
+
+#include "platform/Error.h"
+#include "platform/text/Text.h"
+
+#include <array>
+#include <algorithm>
+#include <fstream>
+#include <mdbtools.h>
+
+namespace tovimar::platform::access {
+
+namespace {
+
+constexpr int kMaxPropertyObjects = 10000;
+/// Longer memo texts are cut: statements of queries reach 64 KB.
+constexpr std::size_t kMaxCell = 200000;
+
+void CheckSignature(const std::string& nativePath) {
+    std::array<char, 19> start{};
+    std::ifstream file(nativePath, std::ios::binary);
+    if (!file)
+        throw RaisedError(kFailure1, nativePath + ": the file can't be opened.", "DatabaseReader");
+    file.read(start.data(), static_cast<std::streamsize>(start.size()));
+    const std::string_view signature(start.data() + 4, 15);
+    const bool known = signature == "Standard Jet DB" || signature == "Standard ACE DB";
+    file.seekg(0, std::ios::end);
+    if (!known || start[1] != 1 || file.tellg() < 3 * 2048)
+        throw RaisedError(kFailure1, nativePath + ": the file is no Access database.", "DatabaseReader");
+}
+
+FieldType TypeOf(int columnType) {
+    switch (columnType) {
+    case MDB_REPID:
+        return FieldType::Guid;
+    case MDB_NUMERIC:
+        return FieldType::Decimal;
+    case MDB_COMPLEX:
+        return FieldType::Attachment;
+    default:
+        return columnType >= MDB_BOOL && columnType <= MDB_MEMO ? static_cast<FieldType>(columnType)
+                                                                : FieldType::Binary;
+    }
+}
+
+MdbColumn* ColumnAt(const MdbTableDef* table, unsigned int index) {
+    return static_cast<MdbColumn*>(g_ptr_array_index(table->columns, index));
+}
+
+void CopyText(gpointer key, gpointer value, gpointer texts) {
+    static_cast<NamedTexts*>(texts)->emplace_back(static_cast<const char*>(key), static_cast<const char*>(value));
+}
+
+NamedTexts CopyTexts(const MdbProperties* properties) {
+    NamedTexts texts;
+    if (properties && properties->hash)
+        g_hash_table_foreach(properties->hash, CopyText, &texts);
+    std::sort(texts.begin(), texts.end()); // the library's order is that of its hash
+    return texts;
+}
+
+FieldDefinition ReadField(const MdbTableDef* table, unsigned int index) {
+    const auto* column = ColumnAt(table, index);
+    FieldDefinition field;
+    field.name = text::MakeValidUtf8(column->name);
+    field.type = TypeOf(column->col_type);
+    const bool twoBytes = table->entry->mdb->f->jet_version != MDB_VER_JET3;
+    field.size = column->col_type == MDB_TEXT && twoBytes ? column->col_size / 2 : column->col_size;
+    field.autoNumber = column->is_long_auto != 0 || column->is_uuid_auto != 0;
+    field.properties = CopyTexts(column->props);
+    return field;
+}
+
+void ReadIndexes(MdbTableDef* source, TableDefinition& table) {
+    constexpr unsigned char kPrimary = 1;
+    mdb_read_indices(source);
+    for (guint i = 0; source->indices && i < source->indices->len; ++i) {
+        const auto* index = static_cast<MdbIndex*>(g_ptr_array_index(source->indices, i));
+        IndexDefinition read;
+        read.name = text::MakeValidUtf8(index->name);
+        read.primary = index->index_type == kPrimary;
+        read.unique = read.primary || (index->flags & MDB_IDX_UNIQUE) != 0;
+        for (unsigned int key = 0; key < std::min(index->num_keys, unsigned{MDB_MAX_IDX_COLS}); ++key) {
+            const auto column = static_cast<std::size_t>(index->key_col_num[key]) - 1;
+            if (column >= table.fields.size())
+                continue;
+            read.fields.push_back(table.fields[column].name);
+            table.fields[column].inPrimaryKey = table.fields[column].inPrimaryKey || read.primary;
+        }
+        table.indexes.push_back(std::move(read));
+    }
+}
+
+} // namespace
+
+MdbTable::MdbTable(MdbTableDef* table) : table_(table) {}
+
+MdbTable::~MdbTable() {
+    mdb_free_tabledef(table_);
+}
+
+TableDefinition MdbTable::Definition() const {
+    TableDefinition table;
+    table.name = text::MakeValidUtf8(table_->name);
+    table.properties = CopyTexts(table_->props);
+    for (unsigned int i = 0; i < table_->num_cols; ++i)
+        table.fields.push_back(ReadField(table_, i));
+    ReadIndexes(table_, table);
+    return table;
+}
+
+std::vector<std::string> MdbTable::ColumnNames() const {
+    std::vector<std::string> names;
+    for (unsigned int i = 0; i < table_->num_cols; ++i)
+        names.push_back(text::MakeValidUtf8(ColumnAt(table_, i)->name));
+    return names;
+}
+
+void MdbTable::ForEachRow(const std::function<bool(const std::vector<std::string>& cells)>& row) {
+    const auto count = table_->num_cols;
+    std::vector<std::string> buffers(count, std::string(kMaxCell + 1, '\0'));
+    std::vector<int> lengths(count, 0);
+    for (unsigned int i = 0; i < count; ++i)
+        mdb_bind_column(table_, static_cast<int>(i) + 1, buffers[i].data(), &lengths[i]);
+    mdb_rewind_table(table_);
+    std::vector<std::string> cells(count);
+    while (mdb_fetch_row(table_)) {
+        for (unsigned int i = 0; i < count; ++i)
+            cells[i] = lengths[i] > 0 ? text::MakeValidUtf8(buffers[i].c_str()) : std::string();
+        if (!row(cells))
+            return;
+    }
+}
+
+struct MdbFile::Handle {
+    MdbHandle* mdb = nullptr;
+};
+
+MdbFile::MdbFile(const std::string& nativePath) : handle_(std::make_unique<Handle>()) {
+    CheckSignature(nativePath);
+    handle_->mdb = mdb_open(nativePath.c_str(), MDB_NOFLAGS);
+    if (handle_->mdb && !mdb_read_catalog(handle_->mdb, MDB_ANY)) {
+        mdb_close(handle_->mdb);
+        handle_->mdb = nullptr;
+    }
+    if (!handle_->mdb)
+        throw RaisedError(kFailure1, nativePath + ": the database can't be read; it may be damaged or encrypted.",
+                          "DatabaseReader");
+    mdb_set_bind_size(handle_->mdb, kMaxCell);
+    mdb_set_date_fmt(handle_->mdb, "%Y-%m-%d %H:%M:%S");
+    mdb_set_shortdate_fmt(handle_->mdb, "%Y-%m-%d");
+}
+
+MdbFile::~MdbFile() {
+    mdb_close(handle_->mdb);
+}
+
+std::unique_ptr<MdbTable> MdbFile::OpenTable(const std::string& name) {
+    // Names in the catalogue may be cut inside of a character; they are compared as the library gives them.
+    auto* catalog = handle_->mdb->catalog;
+    for (guint i = 0; i < catalog->len; ++i) {
+        auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(catalog, i));
+        if (entry->object_type != MDB_TABLE || text::MakeValidUtf8(entry->object_name) != name)
+            continue;
+        auto* table = mdb_read_table(entry);
+        if (!table)
+            return nullptr;
+        if (!mdb_read_columns(table) || table->columns->len < table->num_cols) {
+            mdb_free_tabledef(table);
+            return nullptr;
+        }
+        return std::unique_ptr<MdbTable>(new MdbTable(table));
+    }
+    return nullptr;
+}
+
+ObjectProperties MdbFile::Properties(const std::string& name) const {
+    ObjectProperties read;
+    auto* catalog = handle_->mdb->catalog;
+    for (guint i = 0; i < catalog->len; ++i) {
+        auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(catalog, i));
+        if (!entry->props || text::MakeValidUtf8(entry->object_name) != name)
+            continue;
+        for (guint k = 0; k < std::min<guint>(entry->props->len, kMaxPropertyObjects); ++k) {
+            const auto* properties = static_cast<MdbProperties*>(g_ptr_array_index(entry->props, k));
+            const std::string owner = properties->name ? properties->name : "";
+            if (owner.empty())
+                read.own = CopyTexts(properties);
+            else
+                read.fields.emplace_back(text::MakeValidUtf8(owner), CopyTexts(properties));
+        }
+    }
+    return read;
+}
+
+} // namespace tovimar::platform::access

@@ -1,0 +1,150 @@
+// The pictures of a topic and their image maps.
+
+#include "topics/TopicSections.h"
+
+#include "platform/Environment.h"
+#include "platform/files/Paths.h"
+#include "platform/text/Text.h"
+#include "topics/TopicNames.h"
+#include "uimodel/CXmlForm.h"
+#include "uimodel/SaturatedSum.h"
+
+#include <array>
+
+namespace tovimar {
+
+namespace {
+
+constexpr std::string_view kMapOpening = "<!-- + CONTROLS MAP + -->\r\n<MAP NAME=\"";
+constexpr std::string_view kMapClosing = "</MAP>\r\n<!-- - CONTROLS MAP - -->\r\n";
+
+/// How far Access paints the content of a container below its frame's edge, pixels.
+std::int32_t EdgeOf(const CXmlForm& form, const CXmlControl& container) {
+    if (!text::EqualsIgnoringCase(form.SourceProjectType, "MS ACCESS"))
+        return 0;
+    if (container.IsClass("Frame") || container.IsClass("OptionGroup"))
+        return 8;
+    if (container.IsClass("TabControl") || container.IsClass("Page") || container.IsClass("SSTab"))
+        return 2;
+    return 0;
+}
+
+using Corners = std::array<std::int32_t, 4>;
+
+Corners CornersInControlPicture(const CXmlForm& form, const CXmlControl& control, const CXmlControl& parent) {
+    const CXmlControl* page = parent.IsTabPage() ? parent.ParentControl() : nullptr;
+    const CXmlControl& reference = page == nullptr ? parent : *page;
+    const std::int32_t edge = EdgeOf(form, reference);
+    const std::int32_t left = SaturatedSum(0, -std::int64_t{reference.HotSpotLeft()});
+    const std::int32_t top = SaturatedSum(edge, -std::int64_t{reference.HotSpotTop()});
+    return {SaturatedSum(control.HotSpotLeft(), left), SaturatedSum(control.HotSpotTop(), top),
+            SaturatedSum(control.HotSpotRight(), left), SaturatedSum(control.HotSpotBottom(), top)};
+}
+
+} // namespace
+
+void TopicSections::AppendArea(std::string& out, const std::string& prefix, const CXmlForm& form,
+                               const CXmlControl& control, const CXmlControl* parent, bool ofTab) {
+    Corners corners;
+    if (ofTab)
+        corners = {control.TabHotSpotLeft(), control.TabHotSpotTop(), control.TabHotSpotRight(),
+                   control.TabHotSpotBottom()};
+    else if (parent == nullptr)
+        corners = {control.HotSpotLeft(), control.HotSpotTop(), control.HotSpotRight(),
+                   control.HotSpotBottom()};
+    else
+        corners = CornersInControlPicture(form, control, *parent);
+    out.append("<AREA SHAPE=\"RECT\" COORDS=\"");
+    for (std::size_t i = 0; i < corners.size(); ++i)
+        out.append(i == 0 ? "" : ",").append(std::to_string(corners[i]));
+    out.append("\" HREF=\"#").append(prefix).append("_").append(ControlBookmark(control));
+    out.append("\" FRAME=\"\" alt=\"").append(control.Caption()).append("\" />");
+}
+
+void TopicSections::AppendMap(std::string& out) const {
+    if (!form_.HasMap)
+        return;
+    out.append(kMapOpening).append(prefix_).append("\"> \r\n");
+    for (const auto& control : form_.Controls) {
+        if (control->IsLabel())
+            continue;
+        if (control->IsClass("TabControl")) {
+            AppendAreasOfTabControl(out, *control);
+            continue;
+        }
+        AppendArea(out, prefix_, form_, *control, nullptr, false);
+        out.append("\r\n");
+    }
+    out.append(kMapClosing);
+}
+
+void TopicSections::AppendAreasOfTabControl(std::string& out, const CXmlControl& control) const {
+    const auto append = [&](const CXmlControl& shown, bool ofTab) {
+        AppendArea(out, prefix_, form_, shown, nullptr, ofTab);
+        out.append("\r\n");
+    };
+    bool first = true;
+    for (const auto& page : control.Controls) {
+        if (page->TabTop > -1)
+            append(*page, true);
+        // The picture shows the first page; what stands on the others has no place in it.
+        if (first)
+            for (const auto& child : page->Controls)
+                if (!child->IsLabel())
+                    append(*child, false);
+        first = false;
+    }
+}
+
+void TopicSections::AppendMapOfControl(std::string& out, const CXmlControl& control) const {
+    if (!form_.HasMap || control.Controls.Empty())
+        return;
+    out.append(kMapOpening).append(Anchor(control)).append("\"> \r\n");
+    for (const auto& child : control.Controls)
+        if (!child->IsLabel()) {
+            AppendArea(out, prefix_, form_, *child, &control, false);
+            out.append("\r\n");
+        }
+    out.append(kMapClosing);
+}
+
+std::string TopicSections::FullImagePath(const std::string& fullPath) const {
+    if (switches_.localImagePath || switches_.picsFolder.empty())
+        return fullPath;
+    return platform::WithTrailingBackslash(switches_.picsFolder) + platform::FileNameOf(fullPath);
+}
+
+std::string TopicSections::ImageSource(const std::string& localPath, const std::string& fullPath) const {
+    if (switches_.localImagePath)
+        return localPath;
+    const std::string path = FullImagePath(fullPath);
+    const std::string topicFolder = platform::FolderOf(form_.HtmlFullPath());
+    const std::string folder = platform::FolderOf(path);
+    if (!topicFolder.empty() && text::StartsWithIgnoringCase(folder, topicFolder))
+        return text::Mid(path, text::Length(topicFolder) + 1);
+    return path;
+}
+
+void TopicSections::AppendImageTag(std::string& out, const std::string& source,
+                                   const std::string& mapName) const {
+    out.append("<IMG SRC=\"").append(source).append("\" BORDER=0 \r\n");
+    if (form_.HasMap)
+        out.append("USEMAP=\"#").append(mapName).append("\" ");
+    out.append("/>\r\n");
+}
+
+void TopicSections::AppendMainImage(std::string& out) const {
+    if (!platform::Env().files->FileExists(FullImagePath(form_.PicFullPath())))
+        return;
+    out.append("<!-- + MAIN IMAGE + -->\r\n");
+    AppendImageTag(out, ImageSource(form_.PicLocalPath(), form_.PicFullPath()), prefix_);
+    out.append("<!-- - MAIN IMAGE - -->\r\n");
+}
+
+void TopicSections::AppendControlImage(std::string& out, const CXmlControl& control) const {
+    out.append("<!-- + CONTROL IMAGE + -->\r\n");
+    AppendImageTag(out, ImageSource(control.PicLocalPath(), control.PicFullPath), Anchor(control));
+    out.append("<!-- - CONTROL IMAGE - -->\r\n");
+}
+
+} // namespace tovimar
