@@ -31,7 +31,8 @@ using platform::MessageBoxAnswer;
 /// no box appears, the default button answers, and message and answer are traced. A warning that only
 /// tells (exclamation icon, OK button) counts in the run state's `warningCount`.
 int ShowMessage(const std::string& message, std::uint32_t flags, const std::string& title,
-                const std::string& helpFile = {}, std::int32_t helpContext = 0, const std::string& source = {});
+                const std::string& helpFile = {}, std::int32_t helpContext = 0,
+                const std::string& source = {});
 
 /// Unattended mode and the log that its answers go to (null: none; not owned).
 void SetUnattendedMessages(bool vfOn, CTraceLog* robjLog);

@@ -9,7 +9,9 @@
 namespace tovimar {
 namespace {
 
-[[noreturn]] void RaiseTypeMismatch() { throw RaisedError(13, "Type mismatch", "Value"); }
+[[noreturn]] void RaiseTypeMismatch() {
+    throw RaisedError(13, "Type mismatch", "Value");
+}
 
 std::optional<double> ParseNumber(const std::string& text) {
     const auto first = text.find_first_not_of(" \t");

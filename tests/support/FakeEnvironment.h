@@ -79,7 +79,7 @@ public:
 };
 
 /// Base of tests that touch the surroundings: real files in a fresh folder, everything else faked. The
-/// installation is that of the source tree's `install` folder unless a test copies its own to `Installation()`.
+/// installation is that of the source tree's `install` folder unless a test sets its own.
 class EnvironmentTest : public ::testing::Test {
 protected:
     EnvironmentTest();

@@ -1,0 +1,167 @@
+#include "foundation/CAddInProjects.h"
+
+#include "foundation/CXMLFile.h"
+#include "foundation/ErrorTrap.h"
+#include "foundation/Product.h"
+#include "foundation/Session.h"
+#include "foundation/ShowMessage.h"
+#include "foundation/TextEncodings.h"
+#include "platform/Environment.h"
+#include "platform/files/Paths.h"
+#include "platform/xml/XmlDocument.h"
+
+/// Reading and writing the catalogue's file.
+namespace tovimar {
+namespace {
+
+constexpr const char* kClass = "CAddInProjects";
+constexpr const char* kEmptyCatalogue = "<Projects>\r\n</Projects>";
+
+std::string ProjectLine(const CAddInProject& project) {
+    return "    <Project Name = \"" + EncodeSpecialChars(project.Name) + "\" FileName = \"" +
+           EncodeSpecialChars(project.FileName) + "\" Folder = \"" + EncodeSpecialChars(project.Folder) +
+           "\" SourceProjectFullPath = \"" + EncodeSpecialChars(project.SourceProjectFullPath) +
+           "\" SUID = \"" + project.SUID + "\" HUID = \"" + project.HUID + "\" />\r\n";
+}
+
+/// Loads the catalogue, and its backup in its place when it is broken.
+void LoadOrRepair(const std::string& path, XmlDocument& document) {
+    auto& files = *platform::Env().files;
+    CXMLFile file;
+    if (file.Load(path, document) == 0)
+        return;
+    if (files.FileExists(path + ".bak")) {
+        files.CopyFile(path + ".bak", path);
+        if (file.Load(path, document) == 0)
+            return;
+    }
+    throw RaisedError(kFailure2, "XML Projects file parse error [" + path + "]", "CAddInProjects.Init");
+}
+
+std::string EitherAttribute(const XmlNode& element, const char* lower, const char* upper) {
+    const std::string value = element.attribute(lower);
+    return value.empty() ? element.attribute(upper) : value;
+}
+
+/// Title and pictures folder stand in the project's own file.
+void ReadProjectFile(CAddInProject& project, const std::string& path) {
+    XmlDocument document;
+    if (CXMLFile().Load(path, document) != 0)
+        throw RaisedError(kFailure3,
+                          "XML project file parse error [" + path +
+                              "]\r\nThis project will be removed from the list of available projects.",
+                          "CAddInProjects.Init");
+    project.SetTitle(document.selectSingleNode("//Project").attribute("title"));
+    const XmlNode option =
+        document.selectSingleNode("//Settings/Options/Option[@Name=\"SubFolderForScreenshots\"]");
+    if (option)
+        project.PicsSubfolderName = option.attribute("Value");
+}
+
+} // namespace
+
+ResultCode CAddInProjects::Init(const std::string& vstrProjectsDefFullPath) {
+    if (loading_)
+        return kSuccess;
+    loading_ = true;
+    path_ = vstrProjectsDefFullPath;
+    const ResultCode result = Trapped(kClass, "Init", [&] { ReadCatalogue(); });
+    loading_ = false;
+    return result;
+}
+
+void CAddInProjects::ReadCatalogue() {
+    auto& files = *platform::Env().files;
+    if (!path_.empty() && !files.FileExists(path_)) {
+        files.MakeFolders(platform::FolderOf(path_));
+        CXMLFile().SaveXml(path_, kEmptyCatalogue);
+    }
+    if (path_.empty() || !files.FileExists(path_)) {
+        ShowMessage(path_.empty() ? "Projects definitions XML file is not defined."
+                                  : "Can't find project definitions XML file '" + path_ + "'",
+                    kMsgCritical, kApplicationTitle, {}, 0, "CAddInProjects.Init");
+        return;
+    }
+    XmlDocument document;
+    LoadOrRepair(path_, document);
+    const XmlNode projects = document.selectSingleNode("//Projects");
+    if (!projects)
+        throw RaisedError(kFailure1, "XML Projects file parse error [" + path_ + "]", "CAddInProjects.Init");
+    for (const XmlNode& element : projects.childElements())
+        ReadProject(element);
+    loaded_ = true;
+}
+
+void CAddInProjects::ReadProject(const XmlNode& element) {
+    auto project = std::make_unique<CAddInProject>();
+    project->Name = EitherAttribute(element, "name", "Name");
+    project->FileName = element.attribute("FileName");
+    project->Folder = element.attribute("Folder");
+    project->SourceProjectFullPath = element.attribute("SourceProjectFullPath");
+    project->SUID = element.attribute("SUID");
+    project->HUID = element.attribute("HUID");
+    project->IsNew = false;
+    try {
+        const std::string path = project->TvpFullPath();
+        if (!path.empty() && !platform::Env().files->FileExists(path))
+            project->Name.clear();
+        else if (!path.empty())
+            ReadProjectFile(*project, path);
+        if (!project->Name.empty())
+            Add(std::move(project));
+    } catch (const RaisedError& error) {
+        UserWarningMessage(error.what());
+    }
+}
+
+ResultCode CAddInProjects::SaveCurrentProject(const std::string& vstrFullPath2Save) {
+    return Trapped(kClass, "SaveCurrentProject", [&] {
+        const bool ownFile = vstrFullPath2Save.empty() && current_ != nullptr;
+        Save(ownFile ? current_->TvpFullPath() : vstrFullPath2Save);
+    });
+}
+
+void CAddInProjects::Save(const std::string& vstrProjectTreeFullPathToSave) {
+    Projects();
+    if (!vstrProjectTreeFullPathToSave.empty())
+        SaveTree(vstrProjectTreeFullPathToSave);
+    SaveCatalogue();
+}
+
+void CAddInProjects::SaveTree(const std::string& path) {
+    std::string attributes;
+    if (current_ != nullptr)
+        attributes = "Name = \"" + EncodeSpecialChars(current_->Name) + "\" SUID = \"" + current_->SUID +
+                     "\" HUID = \"" + current_->HUID + "\" ";
+    Session::Context().SaveTree(path, attributes,
+                                current_ != nullptr ? current_->PicsSubfolderName : std::string());
+}
+
+void CAddInProjects::SaveCatalogue() {
+    std::string text = "<Projects>\r\n";
+    for (const auto& project : list_) {
+        if (project->TvpFullPath().empty())
+            continue;
+        if (project->Title().empty())
+            project->SetTitle(Session::Context().HelpProjectTitle());
+        text += ProjectLine(*project);
+        project->IsNew = false;
+    }
+    WriteCatalogue(text + "</Projects>");
+}
+
+void CAddInProjects::WriteCatalogue(const std::string& text) {
+    auto& environment = platform::Env();
+    auto& files = *environment.files;
+    const bool hadFile = files.FileExists(path_);
+    if (hadFile)
+        files.CopyFile(path_, path_ + ".bak");
+    CXMLFile file;
+    file.SaveXml(path_, text);
+    environment.doEvents();
+    XmlDocument document;
+    if (file.Load(path_, document) != 0 && hadFile)
+        files.CopyFile(path_ + ".bak", path_);
+}
+
+} // namespace tovimar

@@ -1,0 +1,105 @@
+#include "platform/files/NativeFile.h"
+
+#include "platform/files/FileFailure.h"
+
+#include <cerrno>
+#include <cstdlib>
+#include <fcntl.h>
+#include <unistd.h>
+#include <utility>
+
+namespace tovimar::platform {
+namespace {
+
+mode_t ModeForNewFiles() {
+    static const mode_t mask = [] {
+        const mode_t current = umask(0);
+        umask(current);
+        return current;
+    }();
+    return static_cast<mode_t>(0666 & ~mask);
+}
+
+} // namespace
+
+NativeFile::NativeFile(const std::string& path, int flags)
+    // Without O_NONBLOCK the opening of a pipe with nobody at its other end would never return.
+    : descriptor_(open(path.c_str(), flags | O_CLOEXEC | O_NONBLOCK, 0666)), path_(path) {
+    if (descriptor_ < 0)
+        RaiseFileFailure(errno, path_);
+}
+
+NativeFile NativeFile::TemporaryBeside(const std::string& target) {
+    std::string pattern = target.substr(0, target.rfind('/') + 1) + ".tovimar-XXXXXX";
+    const int descriptor = mkostemp(pattern.data(), O_CLOEXEC);
+    if (descriptor < 0)
+        RaiseFileFailure(errno, target);
+    NativeFile file(descriptor, pattern);
+    struct stat info {};
+    fchmod(descriptor, stat(target.c_str(), &info) == 0 ? info.st_mode & 07777 : ModeForNewFiles());
+    return file;
+}
+
+NativeFile::~NativeFile() {
+    if (descriptor_ >= 0)
+        close(descriptor_);
+}
+
+NativeFile::NativeFile(NativeFile&& other) noexcept
+    : descriptor_(std::exchange(other.descriptor_, -1)), path_(std::move(other.path_)) {}
+
+struct stat NativeFile::Info() const {
+    struct stat info {};
+    if (fstat(descriptor_, &info) != 0)
+        RaiseFileFailure(errno, path_);
+    return info;
+}
+
+std::string NativeFile::ReadAll() const {
+    const auto info = Info();
+    if (!S_ISREG(info.st_mode))
+        RaiseFileNumber(kPathAccessError, path_);
+    std::string bytes(static_cast<std::size_t>(info.st_size), '\0');
+    std::size_t done = 0;
+    while (done < bytes.size()) {
+        const ssize_t got = read(descriptor_, bytes.data() + done, bytes.size() - done);
+        if (got < 0 && errno == EINTR)
+            continue;
+        if (got < 0)
+            RaiseFileFailure(errno, path_);
+        if (got == 0)
+            break;
+        done += static_cast<std::size_t>(got);
+    }
+    bytes.resize(done);
+    return bytes;
+}
+
+void NativeFile::WriteAll(std::string_view bytes) const {
+    while (!bytes.empty()) {
+        const ssize_t written = write(descriptor_, bytes.data(), bytes.size());
+        if (written < 0 && errno == EINTR)
+            continue;
+        if (written < 0)
+            RaiseFileFailure(errno, path_);
+        bytes.remove_prefix(static_cast<std::size_t>(written));
+    }
+}
+
+void NativeFile::SeekTo(off_t offset) const {
+    if (lseek(descriptor_, offset, SEEK_SET) < 0)
+        RaiseFileFailure(errno, path_);
+}
+
+void NativeFile::CutHere() const {
+    const off_t end = lseek(descriptor_, 0, SEEK_CUR);
+    if (end < 0 || ftruncate(descriptor_, end) != 0)
+        RaiseFileFailure(errno, path_);
+}
+
+void NativeFile::Close() {
+    if (close(std::exchange(descriptor_, -1)) != 0)
+        RaiseFileFailure(errno, path_);
+}
+
+} // namespace tovimar::platform

@@ -1,0 +1,36 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <sys/stat.h>
+
+/// Whole reads and writes of native files. All raise as FileSystem does.
+namespace tovimar::platform {
+
+/// An open file descriptor, closed at the end.
+class NativeFile {
+public:
+    NativeFile(const std::string& path, int flags);
+    /// A fresh file beside `target` with the access rights that `target` has, or a new file gets.
+    static NativeFile TemporaryBeside(const std::string& target);
+    ~NativeFile();
+    NativeFile(NativeFile&& other) noexcept;
+    NativeFile& operator=(NativeFile&&) = delete;
+
+    const std::string& Path() const { return path_; }
+    struct stat Info() const;
+    std::string ReadAll() const;
+    void WriteAll(std::string_view bytes) const;
+    void SeekTo(off_t offset) const;
+    void CutHere() const;
+    /// Reports what writing left unreported.
+    void Close();
+
+private:
+    NativeFile(int descriptor, std::string path) : descriptor_(descriptor), path_(std::move(path)) {}
+
+    int descriptor_ = -1;
+    std::string path_;
+};
+
+} // namespace tovimar::platform
