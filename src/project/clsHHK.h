@@ -1,0 +1,92 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace tovimar {
+
+class CXmlForm;
+
+/// One `param` line of an index entry.
+class clsHHKObjectParameter {
+public:
+    clsHHKObjectParameter(std::string name, std::string value)
+        : Name(std::move(name)), value_(std::move(value)) {}
+
+    std::string Name;
+    /// Of a "Local" parameter the file name part only, so that no folder reaches the file.
+    std::string Value() const;
+    void SetValue(const std::string& value) { value_ = value; }
+
+private:
+    std::string value_;
+};
+
+/// A keyword group or a link in the index. Making one counts as an index entry of the run.
+class clsHHKObject {
+public:
+    struct DisplayOrder {
+        bool operator()(const std::string& left, const std::string& right) const;
+    };
+    using Children = std::map<std::string, std::unique_ptr<clsHHKObject>, DisplayOrder>;
+
+    clsHHKObject();
+
+    std::string Key;
+    std::string ObjectType = "text/sitemap";
+    std::vector<clsHHKObjectParameter> Parameters;
+    bool IsRoot = false;
+
+    /// The key when none was set.
+    std::string IndexGroupDisplayValue() const;
+    void SetIndexGroupDisplayValue(const std::string& value) { displayValue_ = value; }
+
+    /// The child that shows this text; null when there is none.
+    clsHHKObject* GetObject(const std::string& vstrKey) const;
+    bool ObjectExists(const std::string& vstrKey) const { return GetObject(vstrKey) != nullptr; }
+    /// In the place of its display name; dropped when a child of that name, in any case, is there.
+    void Add(std::unique_ptr<clsHHKObject> robj);
+    std::string GenerateHHK(std::int32_t vlngLevel = 0) const;
+    void Terminate() { children_.clear(); }
+    std::size_t Count() const { return children_.size(); }
+
+private:
+    std::string DisplayName(const std::string& parentKey) const;
+    void Append(std::string& out, std::int32_t level) const;
+    void AppendGroup(std::string& out, std::int32_t level) const;
+
+    std::string displayValue_;
+    Children children_;
+};
+
+/// The keyword index of a help project: links under keywords, both sorted without regard to case.
+class clsHHK {
+public:
+    clsHHK();
+    ~clsHHK();
+
+    void AddCustomLink(const std::string& vstrIndexCaption, const std::string& vstrIndexKey,
+                       const std::string& vstrGeneratedFileName, const std::string& vstrBookmarkName);
+    /// The keywords of an object, its documented controls and menus. The file is that of the definition.
+    void AddXmlFormLinks(const CXmlForm& rxmlForm, const std::string& vstrGeneratedHtmlFile);
+    /// The text of the index file; with `FillIndexFromAppObjectsAndControls` off an empty list.
+    std::string HHKContents() const;
+    void Terminate();
+    /// Empty again, as at its making.
+    void Reset();
+
+    /// Several words of more than 32 characters together are cut to 32 and "..."; a single word never is.
+    static std::string TruncateCaption(const std::string& text);
+
+private:
+    struct Source;
+    void AddControlLinks(const CXmlForm& form, const Source& source, const std::string& formCaption,
+                         const std::string& file);
+    std::unique_ptr<clsHHKObject> root_;
+};
+
+} // namespace tovimar
