@@ -1,0 +1,20 @@
+﻿CREATE TABLE [Customers] (
+  [CustomerNo] AUTOINCREMENT,
+  [CustomerName] VARCHAR (80) NOT NULL,
+  [CustomerKind] SHORT,
+  [Contact] VARCHAR (60),
+  [Street] VARCHAR (80),
+  [PostCode] VARCHAR (10),
+  [Town] VARCHAR (50),
+  [Country] VARCHAR (40),
+  [District] VARCHAR (30),
+  [Phone] VARCHAR (30),
+  [Email] VARCHAR (120),
+  [Rebate] DOUBLE,
+  [Catalogue] BIT,
+  [Active] BIT,
+  [Since] DATETIME,
+  [LastContact] DATETIME,
+  [Notes] LONGTEXT,
+   CONSTRAINT [PrimaryKey] PRIMARY KEY ([CustomerNo])
+)
