@@ -48,7 +48,7 @@ struct OpenObject {
     View view = View::Form;
     bool hidden = false;
     WindowHandle window = 0;
-    /// Client area in pixels.
+    /// Client area in pixels; of the form within a subform, the whole subform control.
     int insideWidth = 0;
     int insideHeight = 0;
     /// Page shown by each tab control, from 0; absent means the first.
@@ -60,7 +60,7 @@ struct OpenObject {
     /// records shown, so that its footer's controls lie below the last of them.
     SectionHeights Sections(const SystemMetrics& metrics) const;
     /// Records shown below each other: 1 but in the form view of a continuous form.
-    int ShownRecords() const;
+    int ShownRecords(const SystemMetrics& metrics) const;
 };
 
 /// The controls that are columns of a form's datasheet, from the left: rising `ColumnOrder`, equal ones as

@@ -11,7 +11,7 @@ namespace tovimar::platform {
 struct Image : Bitmap {};
 
 /// Decodes a picture as designs embed it: a device-independent bitmap without file header, a BMP, PNG or
-/// JPEG file, or an icon-less OLE picture around one of them. None for every other format, for damaged
+/// JPEG file, the largest bitmap of an enhanced metafile. None for every other format, for damaged
 /// bytes and for more than 4096 pixels a side.
 std::optional<Image> DecodeImage(std::string_view bytes);
 

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "platform/access/OpenObject.h"
+
+#include <vector>
+
+/// The page of a report as its preview shows it: which sections are printed, how often and where.
+namespace tovimar::platform::painting {
+
+struct PrintedSection {
+    const access::DesignObject* object = nullptr;
+    int top = 0;    ///< on the sheet
+    int height = 0;
+    int row = 0;    ///< record, from 0
+    bool alternate = false;
+};
+
+struct ReportPage {
+    int width = 0; ///< of the sheet
+    int height = 0;
+    int left = 0;  ///< margin
+    std::vector<PrintedSection> sections;
+};
+
+/// `records` is the number of records at hand, below 0 when it isn't known.
+ReportPage PlanReportPage(const access::Design& design, int records, const SystemMetrics& metrics);
+
+/// Grey ground around the sheet.
+inline constexpr int kDeskMargin = 14;
+
+} // namespace tovimar::platform::painting

@@ -1,0 +1,21 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+/// Believable contents for controls whose data isn't at hand. Rows differ; nothing depends on the clock.
+namespace tovimar::platform::painting {
+
+enum class SampleKind { Text, Number, Money, Date, Boolean };
+
+/// What a field is by its display format and its name.
+SampleKind KindOf(std::string_view format, std::string_view fieldName);
+
+/// Content of a field in the row `row` (from 0).
+std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row);
+
+/// A number's or date's text in one of the host's named formats ("Currency", "Short Date", "Percent", ...);
+/// other formats leave it as it is.
+std::string Formatted(const std::string& text, std::string_view format);
+
+} // namespace tovimar::platform::painting
