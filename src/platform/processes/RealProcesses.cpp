@@ -27,9 +27,11 @@ class Child {
 public:
     explicit Child(const std::vector<std::string>& arguments) {
         std::array<int, 2> ends{};
-        if (pipe2(ends.data(), O_CLOEXEC | O_NONBLOCK) != 0)
+        if (pipe2(ends.data(), O_CLOEXEC) != 0)
             throw RaisedError(kFailure1, std::string("No pipe: ") + std::strerror(errno), "Processes");
         output_ = ends[0];
+        // Only our end: the program must be able to wait until we have read.
+        fcntl(output_, F_SETFL, O_NONBLOCK);
         const int error = Spawn(arguments, ends[1]);
         close(ends[1]);
         if (error != 0) {
