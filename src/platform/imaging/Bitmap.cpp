@@ -1,11 +1,15 @@
 #include "platform/imaging/Bitmap.h"
 
+#include <algorithm>
 #include <cstddef>
 
 namespace tovimar::platform {
 
 namespace {
 
+/// Sizes come from definitions, which may be damaged.
+constexpr int kLargestSide = 16384;
+constexpr int kMostPixels = 64'000'000;
 constexpr std::size_t kFileHeader = 14;
 constexpr std::size_t kInfoHeader = 40;
 /// 96 dots an inch in dots a metre.
@@ -22,6 +26,14 @@ void Put32(std::string& out, std::uint32_t value) {
 }
 
 } // namespace
+
+Bitmap BlackBitmap(int width, int height) {
+    Bitmap bitmap;
+    bitmap.width = std::clamp(width, 0, kLargestSide);
+    bitmap.height = std::clamp(height, 0, std::min(kLargestSide, kMostPixels / std::max(1, bitmap.width)));
+    bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height));
+    return bitmap;
+}
 
 std::string EncodeBmp(const Bitmap& bitmap) {
     const std::size_t width = bitmap.Empty() ? 0 : static_cast<std::size_t>(bitmap.width);

@@ -16,6 +16,9 @@ struct Bitmap {
     bool Empty() const { return width <= 0 || height <= 0; }
 };
 
+/// A black picture; sides above 16384 and more than 64 million pixels are cut.
+Bitmap BlackBitmap(int width, int height);
+
 /// Windows bitmap file: 24-bit, rows from the bottom, padded to 4 bytes.
 std::string EncodeBmp(const Bitmap& bitmap);
 

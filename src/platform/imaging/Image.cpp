@@ -73,7 +73,8 @@ private:
             height_ = -height_;
         bits_ = Get16(bytes_, 14);
         const auto compression = Get32(bytes_, 16);
-        const bool known = bits_ == 1 || bits_ == 4 || bits_ == 8 || bits_ == 16 || bits_ == 24 || bits_ == 32;
+        const bool known =
+            bits_ == 1 || bits_ == 4 || bits_ == 8 || bits_ == 16 || bits_ == 24 || bits_ == 32;
         return known && (compression == 0 || compression == 3) && width_ > 0 && height_ > 0 &&
                width_ <= kLargestSide && height_ <= kLargestSide;
     }
@@ -113,7 +114,8 @@ private:
                 target[x] = Premultiplied(255, byte(3 * x + 2), byte(3 * x + 1), byte(3 * x));
                 break;
             case 32:
-                target[x] = Premultiplied(alpha ? byte(4 * x + 3) : 255, byte(4 * x + 2), byte(4 * x + 1), byte(4 * x));
+                target[x] = Premultiplied(alpha ? byte(4 * x + 3) : 255, byte(4 * x + 2), byte(4 * x + 1),
+                                          byte(4 * x));
                 break;
             case 16: {
                 const auto word = Get16(row, 2 * x);
@@ -172,7 +174,8 @@ std::optional<Image> DecodePng(std::string_view bytes) {
         const auto line = static_cast<std::size_t>(result->width);
         const auto stride = static_cast<std::size_t>(cairo_image_surface_get_stride(surface));
         for (std::size_t y = 0; y < static_cast<std::size_t>(result->height); ++y)
-            std::memcpy(result->pixels.data() + y * line, cairo_image_surface_get_data(surface) + y * stride, line * 4);
+            std::memcpy(result->pixels.data() + y * line, cairo_image_surface_get_data(surface) + y * stride,
+                        line * 4);
         if (opaque)
             for (auto& pixel : result->pixels)
                 pixel |= 0xFF000000U;
@@ -190,13 +193,14 @@ std::optional<Image> DecodeJpeg(std::string_view bytes) {
     int width = 0, height = 0, subsampling = 0, colorSpace = 0;
     const auto* source = reinterpret_cast<const unsigned char*>(bytes.data());
     const auto length = static_cast<unsigned long>(bytes.size());
-    if (!turbo || tjDecompressHeader3(turbo.get(), source, length, &width, &height, &subsampling, &colorSpace) != 0 ||
+    if (!turbo ||
+        tjDecompressHeader3(turbo.get(), source, length, &width, &height, &subsampling, &colorSpace) != 0 ||
         width <= 0 || height <= 0 || width > kLargestSide || height > kLargestSide)
         return std::nullopt;
     auto image = Sized(width, height);
     // A picture that breaks off is shown as far as it goes; CMYK isn't.
-    if (tjDecompress2(turbo.get(), source, length, reinterpret_cast<unsigned char*>(image.pixels.data()), width,
-                      width * 4, height, TJPF_BGRA, 0) != 0 &&
+    if (tjDecompress2(turbo.get(), source, length, reinterpret_cast<unsigned char*>(image.pixels.data()),
+                      width, width * 4, height, TJPF_BGRA, 0) != 0 &&
         tjGetErrorCode(turbo.get()) != TJERR_WARNING)
         return std::nullopt;
     return image;

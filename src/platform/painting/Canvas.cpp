@@ -27,9 +27,9 @@ Color Between(Color from, Color to, int step, int steps) {
 } // namespace
 
 Canvas::Canvas(Bitmap& bitmap) : bitmap_(bitmap), clip_{0, 0, bitmap.width, bitmap.height} {
-    auto* surface = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char*>(bitmap.pixels.data()),
-                                                        CAIRO_FORMAT_RGB24, bitmap.width, bitmap.height,
-                                                        bitmap.width * 4);
+    auto* surface = cairo_image_surface_create_for_data(
+        reinterpret_cast<unsigned char*>(bitmap.pixels.data()), CAIRO_FORMAT_RGB24, bitmap.width,
+        bitmap.height, bitmap.width * 4);
     context_ = cairo_create(surface);
     cairo_surface_destroy(surface);
 }
@@ -135,9 +135,9 @@ void Canvas::Draw(const Image& image, const Rectangle& target) {
     auto* context = Context();
     // Cairo only reads from the surface.
     auto* pixels = const_cast<std::uint32_t*>(image.pixels.data());
-    auto* surface = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char*>(pixels),
-                                                        CAIRO_FORMAT_ARGB32, image.width, image.height,
-                                                        image.width * 4);
+    auto* surface =
+        cairo_image_surface_create_for_data(reinterpret_cast<unsigned char*>(pixels), CAIRO_FORMAT_ARGB32,
+                                            image.width, image.height, image.width * 4);
     cairo_save(context);
     cairo_rectangle(context, target.left, target.top, target.Width(), target.Height());
     cairo_clip(context);
@@ -147,7 +147,8 @@ void Canvas::Draw(const Image& image, const Rectangle& target) {
     cairo_set_source_surface(context, surface, 0, 0);
     cairo_pattern_set_extend(cairo_get_source(context), CAIRO_EXTEND_PAD);
     const bool sameSize = target.Width() == image.width && target.Height() == image.height;
-    cairo_pattern_set_filter(cairo_get_source(context), sameSize ? CAIRO_FILTER_NEAREST : CAIRO_FILTER_BILINEAR);
+    cairo_pattern_set_filter(cairo_get_source(context),
+                             sameSize ? CAIRO_FILTER_NEAREST : CAIRO_FILTER_BILINEAR);
     cairo_paint(context);
     cairo_restore(context);
     cairo_surface_destroy(surface);
@@ -159,7 +160,8 @@ cairo_t* Canvas::Context() {
     if (clipPending_) {
         cairo_reset_clip(context_);
         cairo_new_path(context_);
-        cairo_rectangle(context_, clip_.left, clip_.top, std::max(0, clip_.Width()), std::max(0, clip_.Height()));
+        cairo_rectangle(context_, clip_.left, clip_.top, std::max(0, clip_.Width()),
+                        std::max(0, clip_.Height()));
         cairo_clip(context_);
         clipPending_ = false;
     }

@@ -25,8 +25,9 @@ int BorderPixels(const DesignObject& control) {
 }
 
 Rectangle ControlPainter::PlaceOf(const Object& control) const {
-    const auto own = access::ControlRectangle(context_.metrics, place_.frame, place_.offsetY, control.Integer("Left"),
-                                              control.Integer("Top"), control.Integer("Width"), control.Integer("Height"));
+    const auto own =
+        access::ControlRectangle(context_.metrics, place_.frame, place_.offsetY, control.Integer("Left"),
+                                 control.Integer("Top"), control.Integer("Width"), control.Integer("Height"));
     return Moved(own, place_.originX, place_.originY);
 }
 
@@ -126,10 +127,12 @@ std::string ControlPainter::ContentOf(const Object& control) const {
     return source.empty() ? "Unbound" : source;
 }
 
-void ControlPainter::Write(const Object& control, const Rectangle& inner, const std::string& text, bool multiline) {
+void ControlPainter::Write(const Object& control, const Rectangle& inner, const std::string& text,
+                           bool multiline) {
     TextPlace place;
     place.area = {inner.left + Margin(control, "LeftMargin", context_.metrics.twipsPerPixelX),
-                  inner.top + Margin(control, "TopMargin", context_.metrics.twipsPerPixelY), inner.right, inner.bottom};
+                  inner.top + Margin(control, "TopMargin", context_.metrics.twipsPerPixelY), inner.right,
+                  inner.bottom};
     const int align = control.Integer("TextAlign", 0);
     const bool right = align == 3 || (align == 0 && !context_.Designing() && sample_.AlignsRight(control));
     place.align = align == 2 ? Align::Center : right ? Align::Right : Align::Left;
@@ -145,7 +148,8 @@ void ControlPainter::PaintLabel(const Object& control, const Rectangle& area) {
     const auto inner = PaintBox(control, area);
     TextPlace place;
     place.area = {inner.left + 1 + Margin(control, "LeftMargin", context_.metrics.twipsPerPixelX),
-                  inner.top + Margin(control, "TopMargin", context_.metrics.twipsPerPixelY), inner.right, inner.bottom};
+                  inner.top + Margin(control, "TopMargin", context_.metrics.twipsPerPixelY), inner.right,
+                  inner.bottom};
     const int align = control.Integer("TextAlign", 0);
     place.align = align == 2 ? Align::Center : align == 3 ? Align::Right : Align::Left;
     place.wrap = true;
@@ -156,7 +160,8 @@ void ControlPainter::PaintLabel(const Object& control, const Rectangle& area) {
 void ControlPainter::PaintTextBox(const Object& control, const Rectangle& area) {
     auto inner = PaintBox(control, area);
     const int bars = control.Integer("ScrollBars", 0);
-    if ((bars == 2 || bars == 3) && !context_.Designing() && inner.Height() > 2 * context_.metrics.scrollHeight) {
+    if ((bars == 2 || bars == 3) && !context_.Designing() &&
+        inner.Height() > 2 * context_.metrics.scrollHeight) {
         const int left = inner.right - context_.metrics.scrollWidth;
         PaintScrollBar(canvas_, {left, inner.top, inner.right, inner.bottom}, true);
         inner.right = left;
@@ -177,7 +182,8 @@ void ControlPainter::PaintComboBox(const Object& control, const Rectangle& area)
 }
 
 void ControlPainter::PaintCheck(const Object& control, const Rectangle& area) {
-    const auto* group = control.parent != nullptr && control.parent->Is("OptionGroup") ? control.parent : nullptr;
+    const auto* group =
+        control.parent != nullptr && control.parent->Is("OptionGroup") ? control.parent : nullptr;
     bool on = false;
     if (!context_.Designing())
         on = group != nullptr ? sample_.GroupValue(*group, place_.row) == control.Text("OptionValue")
@@ -209,8 +215,8 @@ void ControlPainter::PaintLine(const Object& control, const Rectangle& area) {
         return;
     if (area.Width() > 0 && area.Height() > 0) {
         const bool rising = control.Flag("LineSlant");
-        canvas_.Line(area.left, rising ? area.bottom : area.top, area.right, rising ? area.top : area.bottom, look.color,
-                     look.width);
+        canvas_.Line(area.left, rising ? area.bottom : area.top, area.right, rising ? area.top : area.bottom,
+                     look.color, look.width);
         return;
     }
     const bool flat = area.Height() <= 0;
@@ -225,7 +231,8 @@ void ControlPainter::PaintLine(const Object& control, const Rectangle& area) {
 void ControlPainter::PaintPageBreak(const Rectangle& area) {
     if (context_.Designing())
         for (int i = 0; i < 6; ++i)
-            canvas_.Fill({area.left + 4 * i, area.top, area.left + 4 * i + 2, area.top + 2}, SystemColor::kDarkShadow);
+            canvas_.Fill({area.left + 4 * i, area.top, area.left + 4 * i + 2, area.top + 2},
+                         SystemColor::kDarkShadow);
 }
 
 } // namespace tovimar::platform::painting

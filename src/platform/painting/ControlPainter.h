@@ -12,11 +12,11 @@ namespace tovimar::platform::painting {
 
 /// Where a section's controls lie and which record they show.
 struct SectionPlace {
-    access::Frame frame;   ///< of the object that holds the section
-    int originX = 0;       ///< of its client area in the picture
+    access::Frame frame; ///< of the object that holds the section
+    int originX = 0;     ///< of its client area in the picture
     int originY = 0;
-    int offsetY = 0;       ///< of the section within the client area
-    int row = 0;           ///< record, from 0
+    int offsetY = 0;         ///< of the section within the client area
+    int row = 0;             ///< record, from 0
     Color ground = 0xFFFFFF; ///< the section's colour
 };
 
@@ -42,8 +42,8 @@ private:
     void PaintTextBox(const Object& control, const Rectangle& area);
     void PaintComboBox(const Object& control, const Rectangle& area);
     void PaintListBox(const Object& control, const Rectangle& area);
-    void PaintListRow(const std::vector<std::string>& cells, const std::vector<int>& widths, const Rectangle& area,
-                      const TextStyle& style);
+    void PaintListRow(const std::vector<std::string>& cells, const std::vector<int>& widths,
+                      const Rectangle& area, const TextStyle& style);
     void PaintCheck(const Object& control, const Rectangle& area);
     void PaintButton(const Object& control, const Rectangle& area);
     void PaintThemedFace(const Object& control, const Rectangle& area);

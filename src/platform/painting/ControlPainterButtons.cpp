@@ -16,7 +16,8 @@ constexpr std::uint32_t kClassicGround = 0xFFC0C0C0U;
 
 std::string PictureBytes(const DesignObject& object, access::ApplicationSource* application) {
     for (const auto* property : {"ImageData", "PictureData"})
-        if (const auto* value = object.Find(property); value != nullptr && value->form == access::PropertyValue::Form::Bytes)
+        if (const auto* value = object.Find(property);
+            value != nullptr && value->form == access::PropertyValue::Form::Bytes)
             return value->text;
     const auto name = object.Text("Picture");
     const bool shared = object.Integer("PictureType", 0) == 2;
@@ -25,7 +26,8 @@ std::string PictureBytes(const DesignObject& object, access::ApplicationSource* 
 
 } // namespace
 
-std::optional<Image> PictureOf(const DesignObject& object, access::ApplicationSource* application, bool forButton) {
+std::optional<Image> PictureOf(const DesignObject& object, access::ApplicationSource* application,
+                               bool forButton) {
     const auto bytes = PictureBytes(object, application);
     if (bytes.empty())
         return std::nullopt;
@@ -42,7 +44,8 @@ Rectangle PicturePlace(const Image& image, const Rectangle& area, int sizeMode, 
         return area;
     double scale = 1;
     if (sizeMode == 3)
-        scale = std::min(static_cast<double>(area.Width()) / image.width, static_cast<double>(area.Height()) / image.height);
+        scale = std::min(static_cast<double>(area.Width()) / image.width,
+                         static_cast<double>(area.Height()) / image.height);
     const int width = std::max(1, access::RoundToEven(image.width * scale));
     const int height = std::max(1, access::RoundToEven(image.height * scale));
     // 0 top left, 1 top right, 2 centre, 3 bottom left, 4 bottom right
@@ -59,7 +62,8 @@ Rectangle PicturePlace(const Image& image, const Rectangle& area, int sizeMode, 
 void ControlPainter::PaintThemedFace(const Object& control, const Rectangle& area) {
     const auto face = DesignColor(control, "Back", SystemColor::kFace, context_.Theme());
     const bool gradient = control.Integer("Gradient", 0) != 0;
-    canvas_.FillGradient(area, gradient ? Tinted(face, 75, 100) : face, gradient ? Tinted(face, 100, 96) : face);
+    canvas_.FillGradient(area, gradient ? Tinted(face, 75, 100) : face,
+                         gradient ? Tinted(face, 100, 96) : face);
     if (control.Integer("OldBorderStyle", 1) != 0)
         canvas_.Border(area, DesignColor(control, "Border", SystemColor::kShadow, context_.Theme()));
     // Corners of one pixel make the box look rounded.
@@ -107,7 +111,8 @@ void ControlPainter::PaintPicture(const Object& control, const Rectangle& area) 
     if (!image)
         return;
     const ClipTo clip(canvas_, inner);
-    canvas_.Draw(*image, PicturePlace(*image, inner, control.Integer("SizeMode", 0), control.Integer("PictureAlignment", 2)));
+    canvas_.Draw(*image, PicturePlace(*image, inner, control.Integer("SizeMode", 0),
+                                      control.Integer("PictureAlignment", 2)));
 }
 
 void ControlPainter::PaintForeign(const Object& control, const Rectangle& area) {
@@ -122,9 +127,11 @@ void ControlPainter::PaintForeign(const Object& control, const Rectangle& area) 
     if (control.Is("Image"))
         return;
     const auto kind = control.Text("Class") + control.Text("OLEClass");
-    if (control.Is("Chart") || text::ContainsIgnoringCase(kind, "Graph") || text::ContainsIgnoringCase(kind, "Chart"))
+    if (control.Is("Chart") || text::ContainsIgnoringCase(kind, "Graph") ||
+        text::ContainsIgnoringCase(kind, "Chart"))
         return PaintChart(area);
-    if (control.Is("BoundObjectFrame") || control.Is("Attachment") || !PictureBytes(control, context_.application).empty())
+    if (control.Is("BoundObjectFrame") || control.Is("Attachment") ||
+        !PictureBytes(control, context_.application).empty())
         return;
     canvas_.Border(area, SystemColor::kShadow);
     auto title = control.Text("OLEClass");

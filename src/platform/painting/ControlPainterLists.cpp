@@ -47,7 +47,8 @@ void ControlPainter::PaintListRow(const std::vector<std::string>& cells, const s
     int left = area.left;
     for (std::size_t i = 0; i < cells.size() && i < widths.size() && left < area.right; ++i) {
         if (widths[i] > 0)
-            DrawText(canvas_, cells[i], style, {{left + 2, area.top, std::min(area.right, left + widths[i]), area.bottom}});
+            DrawText(canvas_, cells[i], style,
+                     {{left + 2, area.top, std::min(area.right, left + widths[i]), area.bottom}});
         left += widths[i];
     }
 }
@@ -115,7 +116,11 @@ void ControlPainter::PaintTabHeads(const Object& control, const Rectangle& area,
             canvas_.Fill({head.left, head.top, head.right, head.top + 2}, 0x6C9BD2);
         }
         DrawText(canvas_, input.captions[i], style,
-                 {{head.left + 2, head.top + 1, head.right - 2, head.bottom}, Align::Center, VerticalAlign::Middle, false, true});
+                 {{head.left + 2, head.top + 1, head.right - 2, head.bottom},
+                  Align::Center,
+                  VerticalAlign::Middle,
+                  false,
+                  true});
     }
 }
 

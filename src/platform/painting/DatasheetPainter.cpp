@@ -40,33 +40,43 @@ std::string ColumnTitle(const DesignObject& column) {
 
 /// Head, selectors and lines of a datasheet; gives the rows' places one by one.
 template <typename PaintRow>
-void PaintRows(Canvas& canvas, const SystemMetrics& metrics, const Rectangle& area, int right, int records, const PaintRow& paintRow) {
-    PaintColumnHead(canvas, {area.left, area.top, area.left + metrics.scrollWidth, area.top + metrics.captionHeight}, {});
+void PaintRows(Canvas& canvas, const SystemMetrics& metrics, const Rectangle& area, int right, int records,
+               const PaintRow& paintRow) {
+    PaintColumnHead(
+        canvas, {area.left, area.top, area.left + metrics.scrollWidth, area.top + metrics.captionHeight}, {});
     int top = area.top + metrics.captionHeight;
     for (int row = 0; row < records && top < area.bottom; ++row, top += kDatasheetRow) {
-        PaintRecordSelector(canvas, {area.left, top, area.left + metrics.scrollWidth, top + kDatasheetRow}, row == 0);
+        PaintRecordSelector(canvas, {area.left, top, area.left + metrics.scrollWidth, top + kDatasheetRow},
+                            row == 0);
         paintRow(row, top);
-        canvas.Fill({area.left + metrics.scrollWidth, top + kDatasheetRow - 1, right, top + kDatasheetRow}, SystemColor::kGridLine);
+        canvas.Fill({area.left + metrics.scrollWidth, top + kDatasheetRow - 1, right, top + kDatasheetRow},
+                    SystemColor::kGridLine);
     }
 }
 
 /// A table or query as a subform shows it.
 void PaintTable(const PaintContext& context, const std::string& name, const Rectangle& area) {
-    const auto* records = context.application == nullptr || context.Designing() ? nullptr : context.application->FindRecords(name, kRecordsShown);
+    const auto* records = context.application == nullptr || context.Designing()
+                              ? nullptr
+                              : context.application->FindRecords(name, kRecordsShown);
     context.canvas.Fill(area, SystemColor::kWindow);
     const std::size_t columns = records == nullptr ? 0 : records->columns.size();
     const int first = area.left + context.metrics.scrollWidth;
     const auto columnAt = [&](std::size_t i) { return first + static_cast<int>(i) * kTableColumn; };
     std::size_t shown = 0;
     for (; shown < columns && columnAt(shown) < area.right; ++shown)
-        PaintColumnHead(context.canvas, {columnAt(shown), area.top, columnAt(shown + 1), area.top + context.metrics.captionHeight},
-                        records->columns[shown].name);
+        PaintColumnHead(
+            context.canvas,
+            {columnAt(shown), area.top, columnAt(shown + 1), area.top + context.metrics.captionHeight},
+            records->columns[shown].name);
     const int count = records == nullptr ? 0 : static_cast<int>(records->rows.size());
     PaintRows(context.canvas, context.metrics, area, columnAt(shown), count, [&](int row, int top) {
         const auto& cells = records->rows[static_cast<std::size_t>(row)];
         for (std::size_t i = 0; i < shown && i < cells.size(); ++i)
             DrawText(context.canvas, cells[i], CellStyle(nullptr),
-                     {{columnAt(i) + 3, top, columnAt(i + 1) - 2, top + kDatasheetRow}, Align::Left, VerticalAlign::Middle});
+                     {{columnAt(i) + 3, top, columnAt(i + 1) - 2, top + kDatasheetRow},
+                      Align::Left,
+                      VerticalAlign::Middle});
     });
 }
 
@@ -85,7 +95,8 @@ SourceObject SplitSource(const std::string& sourceObject) {
     return {{}, sourceObject};
 }
 
-const Design* FindSource(access::ApplicationSource& application, const SourceObject& source, bool reportsFirst) {
+const Design* FindSource(access::ApplicationSource& application, const SourceObject& source,
+                         bool reportsFirst) {
     if (source.kind == "form")
         return application.FindDesign(ObjectKind::Form, source.name);
     if (source.kind == "report")
@@ -109,7 +120,8 @@ View ViewWithin(View outer, const Design& inner) {
 void ObjectPainter::PaintCell(const DesignObject& column, const Rectangle& cell, int row) {
     if (column.Is("CheckBox")) {
         const int left = (cell.left + cell.right - 11) / 2;
-        return PaintCheckMark(canvas_, {left, cell.top + 3, left + 11, cell.bottom - 4}, sample_.Checked(column, row), false);
+        return PaintCheckMark(canvas_, {left, cell.top + 3, left + 11, cell.bottom - 4},
+                              sample_.Checked(column, row), false);
     }
     DrawText(canvas_, sample_.Text(column, row), CellStyle(context_.design.root.get()),
              {{cell.left + 3, cell.top, cell.right - 3, cell.bottom},
@@ -125,7 +137,8 @@ void ObjectPainter::PaintDatasheet(const Rectangle& area) {
     const int navigation = NavigationHeight(design, metrics);
     inner.bottom -= navigation;
     if (navigation > 0)
-        PaintNavigationBar(canvas_, {area.left, inner.bottom, area.right, area.bottom}, sample_.RecordCount());
+        PaintNavigationBar(canvas_, {area.left, inner.bottom, area.right, area.bottom},
+                           sample_.RecordCount());
 
     struct Column {
         const DesignObject* object;
@@ -135,9 +148,11 @@ void ObjectPainter::PaintDatasheet(const Rectangle& area) {
     double twips = 0;
     for (const auto* column : access::DatasheetColumns(design)) {
         const int width = access::DatasheetColumnWidth(*column);
-        const int left = access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
+        const int left =
+            access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
         twips += width;
-        const int right = access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
+        const int right =
+            access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
         if (width > 0 && left < inner.right)
             columns.push_back({column, {left, inner.top, right, inner.top + metrics.captionHeight}});
     }
@@ -149,7 +164,8 @@ void ObjectPainter::PaintDatasheet(const Rectangle& area) {
     PaintRows(canvas_, metrics, inner, right, known < 0 ? 8 : known, [&](int row, int top) {
         for (const auto& column : columns) {
             PaintCell(*column.object, {column.place.left, top, column.place.right, top + kDatasheetRow}, row);
-            canvas_.Fill({column.place.right - 1, top, column.place.right, top + kDatasheetRow}, SystemColor::kGridLine);
+            canvas_.Fill({column.place.right - 1, top, column.place.right, top + kDatasheetRow},
+                         SystemColor::kGridLine);
         }
     });
 }
@@ -161,10 +177,13 @@ void PaintSourceObject(const PaintContext& outer, const std::string& sourceObjec
     if (source.kind == "table" || source.kind == "query")
         return PaintTable(outer, source.name, area);
     const auto* design = FindSource(*outer.application, source, outer.design.kind == ObjectKind::Report);
-    const bool itself = design == &outer.design || std::find(outer.outer.begin(), outer.outer.end(), design) != outer.outer.end();
+    const bool itself = design == &outer.design ||
+                        std::find(outer.outer.begin(), outer.outer.end(), design) != outer.outer.end();
     if (design == nullptr || !design->root || itself)
         return;
-    PaintContext context{outer.canvas, outer.metrics, *design, outer.application, ViewWithin(outer.view, *design), outer.pages, outer.outer};
+    PaintContext context{
+        outer.canvas, outer.metrics, *design, outer.application, ViewWithin(outer.view, *design),
+        outer.pages,  outer.outer};
     context.outer.push_back(&outer.design);
     ObjectPainter(context).Paint(area);
 }

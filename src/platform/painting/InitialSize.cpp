@@ -30,9 +30,11 @@ Size DesignSize(const OpenObject& object, const SystemMetrics& metrics) {
     for (const auto& section : sections)
         height += std::max(0, section.object->Integer("Height", 0)) + kDesignBar;
     // A bar takes a little more room than the host counts for it.
-    const int bars = static_cast<int>(sections.size()) *
-                     (ComputeFrame(metrics, object.FrameSettings()).sectionBarHeight - kDesignBar / metrics.twipsPerPixelY);
-    return {painting::PixelsOf(root, "Width", metrics.twipsPerPixelX) + kDesignMarginX / metrics.twipsPerPixelX,
+    const int bars =
+        static_cast<int>(sections.size()) * (ComputeFrame(metrics, object.FrameSettings()).sectionBarHeight -
+                                             kDesignBar / metrics.twipsPerPixelY);
+    return {painting::PixelsOf(root, "Width", metrics.twipsPerPixelX) +
+                kDesignMarginX / metrics.twipsPerPixelX,
             RoundToEven(height / metrics.twipsPerPixelY) + bars};
 }
 
@@ -51,8 +53,10 @@ Size FormSize(const OpenObject& object, const SystemMetrics& metrics) {
     if (painting::IsContinuous(design, object.view) && (bars == 2 || bars == 3))
         size.width += metrics.scrollWidth;
     if (!root.Flag("AutoResize")) {
-        size.width = std::max(size.width, (root.Integer("Right") - root.Integer("Left")) / metrics.twipsPerPixelX);
-        size.height = std::max(size.height, (root.Integer("Bottom") - root.Integer("Top")) / metrics.twipsPerPixelY);
+        size.width =
+            std::max(size.width, (root.Integer("Right") - root.Integer("Left")) / metrics.twipsPerPixelX);
+        size.height =
+            std::max(size.height, (root.Integer("Bottom") - root.Integer("Top")) / metrics.twipsPerPixelY);
     }
     return size;
 }
@@ -71,7 +75,8 @@ Size PreviewSize(const OpenObject& object, const SystemMetrics& metrics) {
     const auto* records = object.application == nullptr || source.empty()
                               ? nullptr
                               : object.application->FindRecords(source, painting::SampleData::kMostRecords);
-    const int known = records == nullptr || records->rows.empty() ? -1 : static_cast<int>(records->rows.size());
+    const int known =
+        records == nullptr || records->rows.empty() ? -1 : static_cast<int>(records->rows.size());
     const auto page = painting::PlanReportPage(*object.design, known, metrics);
     return {page.width + 2 * painting::kDeskMargin, page.height + 2 * painting::kDeskMargin};
 }

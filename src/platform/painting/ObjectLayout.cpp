@@ -60,8 +60,8 @@ std::string GroupField(const Design& design, int level) {
 } // namespace
 
 int PixelsOf(const DesignObject& object, std::string_view property, int twipsPerPixel) {
-    return std::clamp(access::RoundToEven(static_cast<double>(object.Integer(property, 0)) / twipsPerPixel), 0,
-                      kLargestExtent);
+    return std::clamp(access::RoundToEven(static_cast<double>(object.Integer(property, 0)) / twipsPerPixel),
+                      0, kLargestExtent);
 }
 
 bool IsContinuous(const Design& design, View view) {
@@ -83,8 +83,8 @@ bool IsSectionShown(const Design& design, const SectionRef& section, View view) 
 
 bool HasFooter(const Design& design, View view) {
     const auto* footer = design.Section(2);
-    return footer != nullptr && IsSectionShown(design, {2, footer}, view) && footer->Integer("Height", 0) > 0 &&
-           !footer->children.empty();
+    return footer != nullptr && IsSectionShown(design, {2, footer}, view) &&
+           footer->Integer("Height", 0) > 0 && !footer->children.empty();
 }
 
 access::FrameInput FrameSettingsOf(const Design& design, View view) {
@@ -98,7 +98,8 @@ access::FrameInput FrameSettingsOf(const Design& design, View view) {
 }
 
 int NavigationHeight(const Design& design, const SystemMetrics& metrics) {
-    const bool shown = design.kind == access::ObjectKind::Form && design.root && design.root->Flag("NavigationButtons");
+    const bool shown =
+        design.kind == access::ObjectKind::Form && design.root && design.root->Flag("NavigationButtons");
     return shown ? metrics.scrollHeight + 2 : 0;
 }
 
@@ -124,14 +125,16 @@ SectionHeights HeightsOf(const Design& design, View view, int records, const Sys
             continue;
         const auto at = static_cast<std::size_t>(section.number);
         heights.present[at] = true;
-        const double twips = static_cast<double>(section.object->Integer("Height", 0)) * (at == 0 ? records : 1);
-        heights.pixels[at] = std::clamp(access::RoundToEven(twips / metrics.twipsPerPixelY), 0, kLargestExtent * 4);
+        const double twips =
+            static_cast<double>(section.object->Integer("Height", 0)) * (at == 0 ? records : 1);
+        heights.pixels[at] =
+            std::clamp(access::RoundToEven(twips / metrics.twipsPerPixelY), 0, kLargestExtent * 4);
     }
     return heights;
 }
 
-std::vector<PlacedSection> PlacedSections(const Design& design, View view, const SectionHeights& heights, int barHeight,
-                                          const SystemMetrics& metrics) {
+std::vector<PlacedSection> PlacedSections(const Design& design, View view, const SectionHeights& heights,
+                                          int barHeight, const SystemMetrics& metrics) {
     std::vector<PlacedSection> placed;
     for (const auto& section : design.Sections()) {
         if (!IsSectionShown(design, section, view))
@@ -146,7 +149,8 @@ std::vector<PlacedSection> PlacedSections(const Design& design, View view, const
     std::stable_sort(placed.begin(), placed.end(), [](const PlacedSection& left, const PlacedSection& right) {
         return PrintOrder(left.number) < PrintOrder(right.number);
     });
-    const bool grouped = std::any_of(placed.begin(), placed.end(), [](const auto& section) { return section.number > 4; });
+    const bool grouped =
+        std::any_of(placed.begin(), placed.end(), [](const auto& section) { return section.number > 4; });
     int offset = 0;
     for (auto& section : placed) {
         section.offset = grouped ? offset : access::SectionOffsetY(heights, barHeight, section.number);

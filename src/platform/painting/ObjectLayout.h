@@ -16,7 +16,8 @@ bool IsSectionShown(const access::Design& design, const access::SectionRef& sect
 bool HasFooter(const access::Design& design, access::View view);
 access::FrameInput FrameSettingsOf(const access::Design& design, access::View view);
 /// Records below each other that fit into a client area of that height; a choice of its own for height 0.
-int ShownRecordsOf(const access::Design& design, access::View view, int insideHeight, const SystemMetrics& metrics);
+int ShownRecordsOf(const access::Design& design, access::View view, int insideHeight,
+                   const SystemMetrics& metrics);
 /// With the heights of so many records for the detail.
 access::SectionHeights HeightsOf(const access::Design& design, access::View view, int records,
                                  const SystemMetrics& metrics);

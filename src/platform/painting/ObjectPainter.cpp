@@ -35,8 +35,8 @@ Color ObjectPainter::GroundOf(const DesignObject& section, bool alternate) const
     return alternate ? DesignColor(section, "AlternateBack", ground, context_.Theme()) : ground;
 }
 
-void ObjectPainter::PaintControls(const DesignObject& section, int left, int top, const Rectangle& clip, int row,
-                                  Color ground) {
+void ObjectPainter::PaintControls(const DesignObject& section, int left, int top, const Rectangle& clip,
+                                  int row, Color ground) {
     const ClipTo clipped(canvas_, clip);
     SectionPlace place;
     place.frame = frame_;
@@ -65,16 +65,20 @@ void ObjectPainter::PaintForm(const Rectangle& area) {
         PaintScrollBar(canvas_, {inner.right, inner.top, area.right, inner.bottom}, true);
     }
     if (navigation > 0)
-        PaintNavigationBar(canvas_, {area.left, inner.bottom, area.right, area.bottom}, sample_.RecordCount());
+        PaintNavigationBar(canvas_, {area.left, inner.bottom, area.right, area.bottom},
+                           sample_.RecordCount());
 
     const int records = ShownRecordsOf(design, context_.view, area.Height(), context_.metrics);
     const auto heights = HeightsOf(design, context_.view, records, context_.metrics);
     const ClipTo clip(canvas_, inner);
-    for (const auto& section : PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
+    for (const auto& section :
+         PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
         if (section.number == 0)
             PaintRecords(section, inner, records);
         else
-            PaintRecord(section, {inner.left, inner.top + section.offset, inner.right, inner.top + section.offset + section.height},
+            PaintRecord(section,
+                        {inner.left, inner.top + section.offset, inner.right,
+                         inner.top + section.offset + section.height},
                         inner, 0, false);
     }
 }
@@ -89,25 +93,28 @@ void ObjectPainter::PaintRecords(const PlacedSection& section, const Rectangle& 
     const int filled = known < 0 ? shown : std::max(1, known);
     for (int row = 0; row < shown; ++row) {
         const auto edge = [&](int at) {
-            return area.top + section.offset + access::RoundToEven(at * twips / context_.metrics.twipsPerPixelY);
+            return area.top + section.offset +
+                   access::RoundToEven(at * twips / context_.metrics.twipsPerPixelY);
         };
-        const Rectangle place{area.left, edge(row), area.right, continuous ? edge(row + 1) : edge(0) + section.height};
+        const Rectangle place{area.left, edge(row), area.right,
+                              continuous ? edge(row + 1) : edge(0) + section.height};
         if (place.top >= area.bottom || row >= filled)
             break;
         PaintRecord(section, place, area, row, row == 0);
     }
 }
 
-void ObjectPainter::PaintRecord(const PlacedSection& section, const Rectangle& place, const Rectangle& area, int row,
-                                bool current) {
+void ObjectPainter::PaintRecord(const PlacedSection& section, const Rectangle& place, const Rectangle& area,
+                                int row, bool current) {
     const bool alternate = section.number == 0 && row % 2 == 1;
     const auto ground = GroundOf(*section.object, alternate);
     canvas_.Fill(place, ground);
     PaintControls(*section.object, area.left, place.top, place, row, ground);
     const bool continuous = IsContinuous(context_.design, context_.view);
     if (section.number == 0 && frame_.recordSelectorWidth > 0)
-        PaintRecordSelector(canvas_, {area.left, place.top, area.left + frame_.recordSelectorWidth,
-                                      continuous ? place.bottom : std::max(place.bottom, area.bottom)},
+        PaintRecordSelector(canvas_,
+                            {area.left, place.top, area.left + frame_.recordSelectorWidth,
+                             continuous ? place.bottom : std::max(place.bottom, area.bottom)},
                             current);
     if (context_.design.root->Flag("DividingLines") && continuous && section.number != 2)
         canvas_.Fill({area.left, place.bottom - 1, area.right, place.bottom}, SystemColor::kShadow);
@@ -118,7 +125,8 @@ void ObjectPainter::PaintDesign(const Rectangle& area) {
     canvas_.Fill(area, 0xC4C8CD);
     const auto heights = HeightsOf(design, context_.view, 1, context_.metrics);
     const int width = PixelsOf(*design.root, "Width", context_.metrics.twipsPerPixelX);
-    for (const auto& section : PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
+    for (const auto& section :
+         PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
         const int top = area.top + section.offset;
         const int content = top + frame_.sectionBarHeight;
         PaintSectionBar(canvas_, {area.left, top, area.right, content}, SectionTitle(design, section.number));
@@ -126,7 +134,8 @@ void ObjectPainter::PaintDesign(const Rectangle& area) {
         const auto ground = GroundOf(*section.object, false);
         canvas_.Fill(place, ground);
         PaintGrid(place, ground);
-        PaintControls(*section.object, area.left, content, {area.left, content, area.right, place.bottom}, 0, ground);
+        PaintControls(*section.object, area.left, content, {area.left, content, area.right, place.bottom}, 0,
+                      ground);
         canvas_.Fill({place.right, place.top, place.right + 1, place.bottom}, SystemColor::kDarkShadow);
     }
 }
@@ -143,8 +152,8 @@ void ObjectPainter::PaintGrid(const Rectangle& area, Color ground) {
 void ObjectPainter::PaintPreview(const Rectangle& area) {
     canvas_.Fill(area, SystemColor::kDesk);
     const auto page = PlanReportPage(context_.design, sample_.RecordCount(), context_.metrics);
-    const Rectangle sheet{area.left + kDeskMargin, area.top + kDeskMargin, area.left + kDeskMargin + page.width,
-                          area.top + kDeskMargin + page.height};
+    const Rectangle sheet{area.left + kDeskMargin, area.top + kDeskMargin,
+                          area.left + kDeskMargin + page.width, area.top + kDeskMargin + page.height};
     canvas_.Fill(Moved(sheet, 3, 3), 0x808080);
     canvas_.Fill(sheet, SystemColor::kWindow);
     canvas_.Border(sheet, 0x606060);

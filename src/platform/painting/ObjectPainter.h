@@ -18,7 +18,8 @@ public:
 private:
     void PaintForm(const Rectangle& area);
     void PaintRecords(const PlacedSection& section, const Rectangle& area, int records);
-    void PaintRecord(const PlacedSection& section, const Rectangle& place, const Rectangle& area, int row, bool current);
+    void PaintRecord(const PlacedSection& section, const Rectangle& place, const Rectangle& area, int row,
+                     bool current);
     void PaintFormBackground(const Rectangle& area);
     void PaintDesign(const Rectangle& area);
     void PaintGrid(const Rectangle& area, Color ground);
@@ -28,7 +29,8 @@ private:
     void PaintPrintedBody(const Rectangle& area);
     Color GroundOf(const access::DesignObject& section, bool alternate) const;
     /// Controls of a section whose content begins at `top`.
-    void PaintControls(const access::DesignObject& section, int left, int top, const Rectangle& clip, int row, Color ground);
+    void PaintControls(const access::DesignObject& section, int left, int top, const Rectangle& clip, int row,
+                       Color ground);
 
     const PaintContext& context_;
     Canvas& canvas_;

@@ -41,7 +41,8 @@ public:
         Bitmap bitmap;
         bitmap.width = rectangle.Width();
         bitmap.height = rectangle.Height();
-        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height));
+        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) *
+                             static_cast<std::size_t>(bitmap.height));
         if (bitmap.Empty())
             return bitmap;
         painting::Canvas canvas(bitmap);
@@ -53,26 +54,31 @@ public:
     }
 
 private:
-    Shown Now() const { return {object_.design, object_.view, object_.insideWidth, object_.insideHeight, object_.currentPages}; }
+    Shown Now() const {
+        return {object_.design, object_.view, object_.insideWidth, object_.insideHeight,
+                object_.currentPages};
+    }
 
     void Place() {
         const auto& root = object_.design->root;
         frame_ = ComputeFrame(metrics_, object_.FrameSettings());
         const int width = std::clamp(object_.insideWidth, 1, kLargestWidth);
-        const int height = std::clamp(object_.insideHeight, 1, std::min(kLargestHeight, static_cast<int>(kMostPixels / width)));
+        const int height = std::clamp(object_.insideHeight, 1,
+                                      std::min(kLargestHeight, static_cast<int>(kMostPixels / width)));
         const int left = framed_ ? frame_.ClientOffsetX() : 0, top = framed_ ? frame_.ClientOffsetY() : 0;
         client = {left, top, left + width, top + height};
         rectangle.right = rectangle.left + client.right + left;
         rectangle.bottom = rectangle.top + client.bottom + left;
         caption = root ? root->Text("Caption") : std::string();
         if (caption.empty() || object_.view == View::Design)
-            caption = object_.design->name + (object_.view != View::Design                      ? ""
+            caption = object_.design->name + (object_.view != View::Design                 ? ""
                                               : object_.design->kind == ObjectKind::Report ? " : Report"
                                                                                            : " : Form");
     }
 
     void PaintClient(painting::Canvas& canvas) const {
-        const painting::PaintContext context{canvas, metrics_, *object_.design, object_.application, object_.view, &object_.currentPages, {}};
+        const painting::PaintContext context{
+            canvas, metrics_, *object_.design, object_.application, object_.view, &object_.currentPages, {}};
         painting::ObjectPainter(context).Paint(client);
     }
 

@@ -13,15 +13,20 @@ void Sunken(Canvas& canvas, const Rectangle& area) {
 }
 
 void Etched(Canvas& canvas, const Rectangle& area) {
-    canvas.Edge({area.left, area.top, area.right - 1, area.bottom - 1}, SystemColor::kShadow, SystemColor::kShadow);
-    canvas.Edge({area.left + 1, area.top + 1, area.right, area.bottom}, SystemColor::kLight, SystemColor::kLight);
-    canvas.Edge({area.left, area.top, area.right - 1, area.bottom - 1}, SystemColor::kShadow, SystemColor::kShadow);
+    canvas.Edge({area.left, area.top, area.right - 1, area.bottom - 1}, SystemColor::kShadow,
+                SystemColor::kShadow);
+    canvas.Edge({area.left + 1, area.top + 1, area.right, area.bottom}, SystemColor::kLight,
+                SystemColor::kLight);
+    canvas.Edge({area.left, area.top, area.right - 1, area.bottom - 1}, SystemColor::kShadow,
+                SystemColor::kShadow);
 }
 
 void Shadowed(Canvas& canvas, const Rectangle& area, const BorderLook& look) {
     constexpr int kDepth = 2;
-    canvas.Fill({area.left + kDepth, area.bottom, area.right + kDepth, area.bottom + kDepth}, SystemColor::kDarkShadow);
-    canvas.Fill({area.right, area.top + kDepth, area.right + kDepth, area.bottom + kDepth}, SystemColor::kDarkShadow);
+    canvas.Fill({area.left + kDepth, area.bottom, area.right + kDepth, area.bottom + kDepth},
+                SystemColor::kDarkShadow);
+    canvas.Fill({area.right, area.top + kDepth, area.right + kDepth, area.bottom + kDepth},
+                SystemColor::kDarkShadow);
     canvas.Border(area, look.color, look.width);
 }
 
@@ -148,7 +153,8 @@ void PaintRecordSelector(Canvas& canvas, const Rectangle& area, bool current) {
     canvas.Fill(area, SystemColor::kFace);
     canvas.Edge(area, SystemColor::kLight, SystemColor::kShadow);
     if (current)
-        PaintArrow(canvas, {area.left, area.top, area.right, area.top + std::min(area.Height(), 20)}, Arrow::Right, 0x202020);
+        PaintArrow(canvas, {area.left, area.top, area.right, area.top + std::min(area.Height(), 20)},
+                   Arrow::Right, 0x202020);
 }
 
 void PaintNavigationBar(Canvas& canvas, const Rectangle& area, int records) {
@@ -158,7 +164,8 @@ void PaintNavigationBar(Canvas& canvas, const Rectangle& area, int records) {
     const auto style = PartStyle();
     int x = area.left + 4;
     const auto write = [&](const std::string& text, int width) {
-        DrawText(canvas, text, style, {{x, middle, x + width, area.bottom}, Align::Left, VerticalAlign::Middle});
+        DrawText(canvas, text, style,
+                 {{x, middle, x + width, area.bottom}, Align::Left, VerticalAlign::Middle});
         x += width;
     };
     const auto arrow = [&](Arrow direction, bool toEnd) {
@@ -166,7 +173,8 @@ void PaintNavigationBar(Canvas& canvas, const Rectangle& area, int records) {
         PaintArrow(canvas, place, direction, 0x404040);
         const int bar = direction == Arrow::Left ? x + 4 : x + 11;
         if (toEnd)
-            canvas.Fill({bar, (middle + area.bottom) / 2 - 3, bar + 1, (middle + area.bottom) / 2 + 4}, 0x404040);
+            canvas.Fill({bar, (middle + area.bottom) / 2 - 3, bar + 1, (middle + area.bottom) / 2 + 4},
+                        0x404040);
         x += 16;
     };
     write("Record:", MeasureText("Record:", style).width + 4);
@@ -233,7 +241,8 @@ int PaintTitleButtons(Canvas& canvas, const Rectangle& title, const WindowFrame&
     const int height = std::max(4, title.Height() - 6);
     int right = title.right - 4;
     const auto place = [&](int kind, bool enabled) {
-        PaintTitleButton(canvas, {right - kWidth, title.top + 3, right, title.top + 3 + height}, kind, enabled);
+        PaintTitleButton(canvas, {right - kWidth, title.top + 3, right, title.top + 3 + height}, kind,
+                         enabled);
         right -= kWidth + kGap;
     };
     place(2, look.closeButton);
@@ -271,8 +280,9 @@ void PaintWindowFrame(Canvas& canvas, const Rectangle& window, const WindowFrame
              {{textLeft, title.top, textRight, title.bottom}, Align::Left, VerticalAlign::Middle});
     canvas.Border(window, SystemColor::kFrameLine);
     if (side > 1)
-        canvas.Border({window.left + side - 1, window.top + top - 1, window.right - side + 1, window.bottom - side + 1},
-                      SystemColor::kFrameLine);
+        canvas.Border(
+            {window.left + side - 1, window.top + top - 1, window.right - side + 1, window.bottom - side + 1},
+            SystemColor::kFrameLine);
 }
 
 } // namespace tovimar::platform::painting

@@ -36,7 +36,8 @@ TextStyle Style(int weight = 400) {
 /// The database's tables as boxes in columns that come out about as high as broad, joined by lines.
 class RelationshipsWindow final : public Window {
 public:
-    RelationshipsWindow(std::vector<RelationshipTable> tables, std::vector<RelationshipLine> lines, const SystemMetrics& metrics)
+    RelationshipsWindow(std::vector<RelationshipTable> tables, std::vector<RelationshipLine> lines,
+                        const SystemMetrics& metrics)
         : tables_(std::move(tables)), lines_(std::move(lines)) {
         className = "OSysRel";
         caption = "Relationships";
@@ -53,7 +54,8 @@ public:
         Bitmap bitmap;
         bitmap.width = rectangle.Width();
         bitmap.height = rectangle.Height();
-        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height));
+        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) *
+                             static_cast<std::size_t>(bitmap.height));
         Canvas canvas(bitmap);
         canvas.Fill(client, 0xF4F6F8);
         {
@@ -113,15 +115,18 @@ private:
         const Rectangle title{box.place.left, box.place.top, box.place.right, box.place.top + kTitle};
         canvas.FillGradient(title, SystemColor::kTitleTop, SystemColor::kTitleBottom);
         canvas.Border(box.place, SystemColor::kFrameLine);
-        DrawText(canvas, box.table->name, Style(700),
-                 {{title.left + 6, title.top, title.right - 4, title.bottom}, Align::Left, VerticalAlign::Middle});
+        DrawText(
+            canvas, box.table->name, Style(700),
+            {{title.left + 6, title.top, title.right - 4, title.bottom}, Align::Left, VerticalAlign::Middle});
         for (std::size_t i = 0; i < box.fields; ++i) {
             const int top = title.bottom + 1 + kRow * static_cast<int>(i);
             const bool key = i < box.table->inPrimaryKey.size() && box.table->inPrimaryKey[i];
             if (key)
                 PaintKey(canvas, box.place.left + 5, top + 4);
             DrawText(canvas, box.table->fields[i], Style(),
-                     {{box.place.left + 20, top, box.place.right - 3, top + kRow}, Align::Left, VerticalAlign::Middle});
+                     {{box.place.left + 20, top, box.place.right - 3, top + kRow},
+                      Align::Left,
+                      VerticalAlign::Middle});
         }
     }
 
@@ -139,7 +144,8 @@ private:
     }
 
     void PaintLine(Canvas& canvas, const RelationshipLine& line) const {
-        const auto from = byName_.find(text::FoldCase(line.table)), to = byName_.find(text::FoldCase(line.foreignTable));
+        const auto from = byName_.find(text::FoldCase(line.table)),
+                   to = byName_.find(text::FoldCase(line.foreignTable));
         if (from == byName_.end() || to == byName_.end())
             return;
         const auto &one = *from->second, &many = *to->second;
@@ -176,7 +182,8 @@ private:
 } // namespace
 
 std::unique_ptr<Window> MakeRelationshipsWindow(const std::vector<RelationshipTable>& tables,
-                                                const std::vector<RelationshipLine>& lines, const SystemMetrics& metrics) {
+                                                const std::vector<RelationshipLine>& lines,
+                                                const SystemMetrics& metrics) {
     return std::make_unique<RelationshipsWindow>(tables, lines, metrics);
 }
 

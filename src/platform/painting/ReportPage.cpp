@@ -20,7 +20,8 @@ constexpr int kUsualMargin = 40;
 /// The printer settings begin with the margins: left, top, right, bottom, in twips.
 int MarginOf(const Design& design, std::size_t side, const SystemMetrics& metrics) {
     const auto* settings = design.root->Find("PrtMip");
-    if (settings == nullptr || settings->form != access::PropertyValue::Form::Bytes || settings->text.size() < 16)
+    if (settings == nullptr || settings->form != access::PropertyValue::Form::Bytes ||
+        settings->text.size() < 16)
         return kUsualMargin;
     int twips = 0;
     for (std::size_t i = 4; i-- > 0;)
@@ -35,7 +36,8 @@ public:
 
     ReportPage Plan() {
         page_.left = MarginOf(design_, 0, metrics_);
-        page_.width = page_.left + PixelsOf(*design_.root, "Width", metrics_.twipsPerPixelX) + MarginOf(design_, 2, metrics_);
+        page_.width = page_.left + PixelsOf(*design_.root, "Width", metrics_.twipsPerPixelX) +
+                      MarginOf(design_, 2, metrics_);
         top_ = MarginOf(design_, 1, metrics_);
         Print(1, 0);
         Print(3, 0);

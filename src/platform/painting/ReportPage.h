@@ -9,16 +9,16 @@ namespace tovimar::platform::painting {
 
 struct PrintedSection {
     const access::DesignObject* object = nullptr;
-    int top = 0;    ///< on the sheet
+    int top = 0; ///< on the sheet
     int height = 0;
-    int row = 0;    ///< record, from 0
+    int row = 0; ///< record, from 0
     bool alternate = false;
 };
 
 struct ReportPage {
     int width = 0; ///< of the sheet
     int height = 0;
-    int left = 0;  ///< margin
+    int left = 0; ///< margin
     std::vector<PrintedSection> sections;
 };
 

@@ -52,7 +52,8 @@ std::vector<int> ColumnWidths(const DesignObject& control, std::size_t columns) 
 }
 
 std::size_t ColumnCount(const DesignObject& control) {
-    return static_cast<std::size_t>(std::clamp(control.Integer("ColumnCount", 1), 1, static_cast<int>(kMostColumns)));
+    return static_cast<std::size_t>(
+        std::clamp(control.Integer("ColumnCount", 1), 1, static_cast<int>(kMostColumns)));
 }
 
 /// The first column with a width of its own or of the host's choosing.
@@ -80,7 +81,8 @@ std::string FieldName(std::string_view source) {
 }
 
 bool IsTrueWord(const std::string& word) {
-    return text::EqualsIgnoringCase(word, "True") || text::EqualsIgnoringCase(word, "Yes") || word == "-1" || word == "1";
+    return text::EqualsIgnoringCase(word, "True") || text::EqualsIgnoringCase(word, "Yes") || word == "-1" ||
+           word == "1";
 }
 
 bool IsCheck(const DesignObject& control) {
@@ -90,7 +92,8 @@ bool IsCheck(const DesignObject& control) {
 /// Joins what an expression joins: literals, fields and the simple functions around them.
 class Joiner {
 public:
-    template <typename FieldText> static std::string Join(std::string_view expression, const FieldText& fieldText, bool& known) {
+    template <typename FieldText>
+    static std::string Join(std::string_view expression, const FieldText& fieldText, bool& known) {
         std::string result;
         known = true;
         for (std::size_t at = 0; at < expression.size() && known;) {
@@ -103,7 +106,8 @@ public:
                 const auto end = std::min(expression.find(']', at), expression.size());
                 result += fieldText(expression.substr(at + 1, end - at - 1));
                 at = end + 1;
-            } else if (letter == '&' || letter == '+' || letter == ' ' || letter == '(' || letter == ')' || letter == '$') {
+            } else if (letter == '&' || letter == '+' || letter == ' ' || letter == '(' || letter == ')' ||
+                       letter == '$') {
                 ++at;
             } else {
                 at = Word(expression, at, result, known);
@@ -152,7 +156,8 @@ std::string SampleData::FieldText(const DesignObject& control, std::string_view 
     const auto format = control.Text("Format");
     const int column = records_ == nullptr ? -1 : records_->ColumnIndex(name);
     if (column >= 0 && !records_->rows.empty()) {
-        const auto& cells = records_->rows[static_cast<std::size_t>(std::max(0, row)) % records_->rows.size()];
+        const auto& cells =
+            records_->rows[static_cast<std::size_t>(std::max(0, row)) % records_->rows.size()];
         const auto at = static_cast<std::size_t>(column);
         return at < cells.size() ? Formatted(cells[at], format) : std::string();
     }
@@ -214,7 +219,8 @@ std::string SampleData::Text(const DesignObject& control, int row) const {
 
 const Records* SampleData::RowSource(const DesignObject& control) const {
     const auto source = control.Text("RowSource");
-    if (application_ == nullptr || source.empty() || !text::EqualsIgnoringCase(control.Text("RowSourceType", "Table/Query"), "Table/Query"))
+    if (application_ == nullptr || source.empty() ||
+        !text::EqualsIgnoringCase(control.Text("RowSourceType", "Table/Query"), "Table/Query"))
         return nullptr;
     return application_->FindRecords(source, kMostRecords);
 }
@@ -241,7 +247,8 @@ std::string SampleData::LookedUp(const DesignObject& combo, const std::string& v
         const auto& cells = records->rows[static_cast<std::size_t>(std::max(0, row)) % records->rows.size()];
         return shown < cells.size() ? cells[shown] : std::string();
     }
-    const auto* name = records != nullptr && shown < records->columns.size() ? &records->columns[shown].name : &combo.name;
+    const auto* name =
+        records != nullptr && shown < records->columns.size() ? &records->columns[shown].name : &combo.name;
     return SampleText(SampleKind::Text, {}, *name, row);
 }
 
@@ -257,8 +264,8 @@ bool SampleData::Checked(const DesignObject& control, int row) const {
 
 std::string SampleData::GroupValue(const DesignObject& group, int row) const {
     const auto source = group.Text("ControlSource");
-    if (!source.empty() && !source.starts_with('=') && records_ != nullptr && records_->ColumnIndex(FieldName(source)) >= 0 &&
-        !records_->rows.empty())
+    if (!source.empty() && !source.starts_with('=') && records_ != nullptr &&
+        records_->ColumnIndex(FieldName(source)) >= 0 && !records_->rows.empty())
         return FieldText(group, source, row);
     return WithoutQuotes(group.Text("DefaultValue", source.empty() ? "" : "1"));
 }
@@ -269,12 +276,15 @@ bool SampleData::AlignsRight(const DesignObject& control) const {
     const auto source = control.Text("ControlSource");
     if (source.empty() || control.Is("ComboBox"))
         return false;
-    const int column = records_ == nullptr || source.starts_with('=') ? -1 : records_->ColumnIndex(FieldName(source));
+    const int column =
+        records_ == nullptr || source.starts_with('=') ? -1 : records_->ColumnIndex(FieldName(source));
     if (column >= 0) {
         const auto type = records_->columns[static_cast<std::size_t>(column)].type;
-        return type == Records::Type::Number || type == Records::Type::Currency || type == Records::Type::DateTime;
+        return type == Records::Type::Number || type == Records::Type::Currency ||
+               type == Records::Type::DateTime;
     }
-    const auto kind = KindOf(control.Text("Format"), source.starts_with('=') ? std::string_view() : std::string_view(source));
+    const auto kind = KindOf(control.Text("Format"),
+                             source.starts_with('=') ? std::string_view() : std::string_view(source));
     return kind == SampleKind::Number || kind == SampleKind::Money || kind == SampleKind::Date;
 }
 
@@ -306,12 +316,14 @@ SampleData::List SampleData::ListRows(const DesignObject& control) const {
             heads.push_back(records->columns[i].name);
     }
     for (const auto& cells : records->rows)
-        list.rows.emplace_back(cells.begin(), cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
+        list.rows.emplace_back(cells.begin(),
+                               cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
     if (records->rows.empty())
         for (int row = 0; row < 4; ++row) {
             auto& cells = list.rows.emplace_back();
             for (std::size_t i = 0; i < columns && i < records->columns.size(); ++i)
-                cells.push_back(SampleText(KindOf({}, records->columns[i].name), {}, records->columns[i].name, row));
+                cells.push_back(
+                    SampleText(KindOf({}, records->columns[i].name), {}, records->columns[i].name, row));
         }
     return list;
 }

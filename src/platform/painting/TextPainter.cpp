@@ -99,7 +99,8 @@ private:
     const PangoFontDescription* Find(const TextStyle& style) {
         const int size = std::clamp(style.size, kSmallestSize, kLargestSize);
         const bool bold = style.weight >= 600;
-        const auto key = style.family + '\n' + std::to_string(size) + (bold ? "b" : "") + (style.italic ? "i" : "");
+        const auto key =
+            style.family + '\n' + std::to_string(size) + (bold ? "b" : "") + (style.italic ? "i" : "");
         const auto found = fonts_.find(key);
         if (found != fonts_.end())
             return found->second.get();
@@ -172,7 +173,9 @@ void Underline(PangoLayout* layout, const TextStyle& style, const Caption& capti
 }
 
 PangoAlignment Alignment(Align align) {
-    return align == Align::Center ? PANGO_ALIGN_CENTER : align == Align::Right ? PANGO_ALIGN_RIGHT : PANGO_ALIGN_LEFT;
+    return align == Align::Center  ? PANGO_ALIGN_CENTER
+           : align == Align::Right ? PANGO_ALIGN_RIGHT
+                                   : PANGO_ALIGN_LEFT;
 }
 
 /// Left edge of a layout that isn't wrapped; a wrapped one aligns itself.
@@ -212,7 +215,9 @@ void DrawText(Canvas& canvas, std::string_view text, const TextStyle& style, con
     {
         const ClipTo clip(canvas, place.area);
         auto* context = canvas.Context();
-        const auto part = [&](unsigned shift) { return static_cast<double>((style.color >> shift) & 0xFFU) / 255.0; };
+        const auto part = [&](unsigned shift) {
+            return static_cast<double>((style.color >> shift) & 0xFFU) / 255.0;
+        };
         cairo_set_source_rgb(context, part(16), part(8), part(0));
         cairo_move_to(context, left, top);
         pango_cairo_show_layout(context, layout);

@@ -11,19 +11,13 @@ namespace tovimar::platform {
 
 namespace {
 
-/// Pictures are bounded: no window is larger than this in pixels of one side.
-constexpr int kLargestSide = 16384;
-
 /// A rectangle of a picture; what lies outside is black.
 Bitmap Cut(const Bitmap& source, int left, int top, int width, int height) {
-    Bitmap result;
-    result.width = std::clamp(width, 0, kLargestSide);
-    result.height = std::clamp(height, 0, kLargestSide);
+    if (left == 0 && top == 0 && width == source.width && height == source.height)
+        return source;
+    auto result = BlackBitmap(width, height);
     if (result.Empty())
         return {};
-    if (left == 0 && top == 0 && result.width == source.width && result.height == source.height)
-        return source;
-    result.pixels.resize(static_cast<std::size_t>(result.width) * static_cast<std::size_t>(result.height));
     const int from = std::max(0, -left);
     const int to = std::min(result.width, source.width - left);
     for (int y = std::max(0, -top); y < std::min(result.height, source.height - top) && from < to; ++y) {
