@@ -5,6 +5,7 @@
 #include "foundation/TextEncodings.h"
 #include "platform/text/Text.h"
 #include "topics/TopicText.h"
+#include "uimodel/DefinitionText.h"
 
 namespace tovimar {
 
@@ -155,8 +156,10 @@ std::string CFormHTMLControlDef::XMLSTr() const {
 }
 
 void CFormHTMLControlDef::AppendXml(std::string& out) const {
-    out.append("<Item  Name=\"").append(ControlName).append("\" Bmk=\"").append(BookmarkName);
-    out.append("\" Caption=\"").append(EncodeXmlText(TopicCaption)).append("\" ");
+    out.append("<Item  ");
+    definition::Append(out, "Name=\"", definition::Escaped(ControlName));
+    definition::Append(out, "Bmk=\"", definition::Escaped(BookmarkName));
+    definition::Append(out, "Caption=\"", EncodeXmlText(TopicCaption));
     out.append(IsMenu ? "IsMenu = \"True\" " : "").append(" />");
 }
 

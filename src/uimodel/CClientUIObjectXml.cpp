@@ -80,6 +80,8 @@ void EncodeTexts(CXmlControl& control) {
         control.SetText(control.HostCaption);
         control.Indexes.clear();
     }
+    // Before the text is encoded: a keyword shows the caption as it reads.
+    control.FillIndexes();
     control.SetText(EncodeXmlText(control.Text()));
     for (auto& child : control.Controls)
         EncodeTexts(*child);

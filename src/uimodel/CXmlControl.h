@@ -121,6 +121,8 @@ public:
     /// The element from its indent to its end, without a line end. Fills an empty `Indexes`.
     std::string XMLSTr();
     void AppendXml(std::string& out);
+    /// Gives empty `Indexes` the default; writing does it as well.
+    void FillIndexes();
     void SortControlsUsingTabIndex();
     /// Drops the tree below and the way up. A second call does nothing.
     void Terminate();
@@ -138,7 +140,6 @@ private:
     void ReadGeometry(const XmlNode& node);
     void AppendAttributes(std::string& out);
     void AppendChildren(std::string& out, const std::string& indent);
-    std::string DefaultIndexes() const;
     std::string HotSpotText() const;
     std::string TabPageTabText() const;
 

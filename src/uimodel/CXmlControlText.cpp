@@ -74,8 +74,7 @@ void CXmlControl::ReadAttributes(const XmlNode& node, CAddInProject* project) {
     ParentControlName = node.attribute("ParentControlName");
     if (!text::EqualsIgnoringCase(controlType_, "Label")) {
         Indexes = node.attribute("Indexes");
-        if (Indexes.empty())
-            Indexes = DefaultIndexes();
+        FillIndexes();
     }
 }
 
@@ -96,8 +95,9 @@ void CXmlControl::ReadGeometry(const XmlNode& node) {
     }
 }
 
-std::string CXmlControl::DefaultIndexes() const {
-    return KeywordWithoutMarks(IdentifiedByName() ? Name : Caption());
+void CXmlControl::FillIndexes() {
+    if (Indexes.empty())
+        Indexes = KeywordWithoutMarks(IdentifiedByName() ? Name : Caption());
 }
 
 std::string CXmlControl::HotSpotText() const {
@@ -125,14 +125,13 @@ void CXmlControl::AppendXml(std::string& out) {
 }
 
 void CXmlControl::AppendAttributes(std::string& out) {
-    if (Indexes.empty())
-        Indexes = DefaultIndexes();
+    FillIndexes();
     Append(out, "Name = \"", Name4Xml());
     AppendUnlessEmpty(out, "Text = \"", Text4Xml());
     AppendUnlessEmpty(out, "Description = \"", Description4Xml());
-    AppendUnlessEmpty(out, "ClassName = \"", ClassName());
+    AppendPlain(out, "ClassName = \"", ClassName());
     if (!text::EqualsIgnoringCase(OriginalClassName, ClassName()))
-        AppendUnlessEmpty(out, "OriginalClassName = \"", OriginalClassName);
+        AppendPlain(out, "OriginalClassName = \"", OriginalClassName);
     AppendPair(out, "Location = \"", Left, Top);
     AppendPair(out, "Size = \"", Width, Height);
     if (TabIndex > -1)
@@ -141,7 +140,7 @@ void CXmlControl::AppendAttributes(std::string& out) {
         Append(out, "Index = \"", Index);
     if (HelpContextId > 0)
         Append(out, "HelpContextId = \"", HelpContextId);
-    AppendUnlessEmpty(out, "PicFileName = \"", platform::FileNameOf(PicFullPath));
+    AppendPlain(out, "PicFileName = \"", platform::FileNameOf(PicFullPath));
     if (!Visible)
         Append(out, "Visible = \"", "False");
     if (Left >= 0)

@@ -281,13 +281,13 @@ void CXmlForm::AppendAttributes(std::string& out) const {
     Append(out, "BorderStyle = \"", BorderStyle);
     if (HasMap)
         out.append("HasMap = \"True\" ");
-    AppendUnlessEmpty(out, "Charset=\"", Charset);
+    AppendPlain(out, "Charset=\"", Charset);
     AppendUnlessEmpty(out, "Description=\"", EncodeXmlText(Description));
-    AppendUnlessEmpty(out, "Language=\"", Language);
-    AppendUnlessEmpty(out, "Stylesheet=\"", platform::FileNameOf(stylesheetFullPath_));
-    AppendUnlessEmpty(out, "NamePrefix=\"", NamePrefix);
-    AppendUnlessEmpty(out, "PicFileName=\"", platform::FileNameOf(picFullPath_));
-    AppendUnlessEmpty(out, "HtmlFileName=\"", platform::FileNameOf(htmlFullPath_));
+    AppendPlain(out, "Language=\"", Language);
+    AppendPlain(out, "Stylesheet=\"", platform::FileNameOf(stylesheetFullPath_));
+    AppendPlain(out, "NamePrefix=\"", NamePrefix);
+    AppendPlain(out, "PicFileName=\"", platform::FileNameOf(picFullPath_));
+    AppendPlain(out, "HtmlFileName=\"", platform::FileNameOf(htmlFullPath_));
 }
 
 void CXmlForm::AppendOrigin(std::string& out) const {
@@ -295,10 +295,10 @@ void CXmlForm::AppendOrigin(std::string& out) const {
         Append(out, "HelpContextId = \"", HelpContextId);
     if (NewHelpContextIdsCount > 0)
         Append(out, "NewHelpContextIdsCount = \"", NewHelpContextIdsCount);
-    AppendUnlessEmpty(out, "SourceProjectType = \"", SourceProjectType);
-    AppendUnlessEmpty(out, "SourceProjectName = \"", SourceProjectName);
+    AppendPlain(out, "SourceProjectType = \"", SourceProjectType);
+    AppendPlain(out, "SourceProjectName = \"", SourceProjectName);
     AppendUnlessEmpty(out, "OriginalClassName = \"", EncodeXmlText(OriginalClassName));
-    AppendUnlessEmpty(out, "GUIObjectSubType = \"", GUIObjectSubType);
+    AppendPlain(out, "GUIObjectSubType = \"", GUIObjectSubType);
     if (hWnd != 0)
         Append(out, "HWND = \"", hWnd);
     AppendUnlessEmpty(out, "Indexes = \"", EncodeXmlText(Indexes));

@@ -35,6 +35,25 @@ void AppendUnlessEmpty(std::string& out, std::string_view opening, std::string_v
         Append(out, opening, value);
 }
 
+void AppendPlain(std::string& out, std::string_view opening, std::string_view value) {
+    AppendUnlessEmpty(out, opening, Escaped(value));
+}
+
+std::string Escaped(std::string_view value) {
+    std::string escaped;
+    for (const char c : value) {
+        if (c == '&')
+            escaped += "&amp;";
+        else if (c == '<')
+            escaped += "&lt;";
+        else if (c == '"')
+            escaped += "&quot;";
+        else
+            escaped += c;
+    }
+    return escaped;
+}
+
 void AppendPair(std::string& out, std::string_view opening, std::int32_t first, std::int32_t second) {
     Append(out, opening, std::to_string(first) + ", " + std::to_string(second));
 }

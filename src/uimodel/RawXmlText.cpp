@@ -15,12 +15,12 @@ void AppendRawRoot(std::string& out, const RawRoot& root) {
     Append(out, "Caption = \"", EncodeXmlText(root.caption));
     AppendPair(out, "WindowSize = \"", root.width, root.height);
     Append(out, "BorderStyle = \"", root.borderStyle);
-    Append(out, "NamePrefix = \"", root.namePrefix);
+    Append(out, "NamePrefix = \"", Escaped(root.namePrefix));
     AppendPair(out, "ClientAreaOffset = \"", root.clientAreaOffsetX, root.clientAreaOffsetY);
     Append(out, "OriginalClassName = \"", EncodeXmlText(root.originalClassName));
     if (root.helpContextId >= 1 || root.helpContextId == -1)
         Append(out, "HelpContextId = \"", root.helpContextId);
-    AppendUnlessEmpty(out, "SourceProjectType = \"", root.sourceProjectType);
+    AppendPlain(out, "SourceProjectType = \"", root.sourceProjectType);
     if (root.window != 0)
         Append(out, "HWND = \"", root.window);
     AppendUnlessEmpty(out, "Description = \"", EncodeXmlText(root.description));
@@ -43,9 +43,9 @@ void AppendRawControl(std::string& out, const RawControl& control, const std::ve
     if (control.helpContextId > 0)
         Append(out, "HelpContextId = \"", control.helpContextId);
     AppendUnlessEmpty(out, "Description = \"", EncodeXmlText(control.description));
-    AppendUnlessEmpty(out, "SectionName = \"", control.sectionName);
+    AppendPlain(out, "SectionName = \"", control.sectionName);
     AppendUnlessEmpty(out, "ParentControlName = \"", EncodeXmlText(control.parentControlName));
-    AppendUnlessEmpty(out, "OriginalClassName = \"", control.originalClassName);
+    AppendPlain(out, "OriginalClassName = \"", control.originalClassName);
     if (control.level > 0)
         Append(out, "Level = \"", control.level);
     if (control.tabPageIndex > -1)

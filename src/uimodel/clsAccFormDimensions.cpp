@@ -32,6 +32,8 @@ View ViewOf(const HostObject& form) {
         return View::Form;
     case 2:
         return View::Datasheet;
+    case 5:
+        return View::Preview;
     default:
         return View::Design;
     }
@@ -46,13 +48,17 @@ Frame FrameOf(const HostObject& form, View view, bool rulerOn) {
     return platform::access::ComputeFrame(Metrics(), input);
 }
 
-platform::access::SectionHeights HeightsOf(const HostObject& form) {
+platform::access::SectionHeights HeightsOf(const HostObject& form, View view) {
     platform::access::SectionHeights heights;
     for (const int section : platform::access::kSectionOrder) {
         const HostObject object = HostProperty::Object(form, "Section", {section});
         const double height = HostProperty::Number(object, "Height", kAbsentHeight);
         const auto index = static_cast<std::size_t>(section);
-        heights.present[index] = height > kAbsentHeight;
+        // What a view doesn't show takes no room in it, whatever its height says.
+        const bool visible =
+            !HostProperty::Readable(object, "Visible") || HostProperty::Flag(object, "Visible");
+        heights.present[index] =
+            height > kAbsentHeight && platform::access::SectionIsShown(view, section, visible);
         if (heights.present[index])
             heights.pixels[index] = platform::access::RoundToEven(height / Metrics().twipsPerPixelY);
     }
@@ -93,7 +99,7 @@ const clsAccFormDimensions::Answer& clsAccFormDimensions::Of(const HostObject& f
     rulerOn_ = vfRulerOn;
     answer_.view = ViewOf(form);
     answer_.frame = FrameOf(form, answer_.view, vfRulerOn);
-    answer_.heights = HeightsOf(form);
+    answer_.heights = HeightsOf(form, answer_.view);
     return answer_;
 }
 

@@ -44,6 +44,20 @@ struct SectionHeights {
 };
 /// Order from the top: header, page header, detail, page footer, footer.
 inline constexpr std::array<int, 5> kSectionOrder{1, 3, 0, 4, 2};
+/// Does a view show a section at all? `visible` is the section's own property.
+constexpr bool SectionIsShown(View view, int section, bool visible) {
+    switch (view) {
+    case View::Datasheet:
+        return section == 0;
+    case View::Form:
+        return visible && section <= 2;
+    case View::Preview:
+        return visible;
+    case View::Design:
+        break;
+    }
+    return true;
+}
 /// What lies above a section within the client area: bars and heights of the sections above it.
 int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int section);
 
