@@ -71,13 +71,13 @@ std::string_view NameIn(std::string_view entity) {
 }
 
 const Entity* FindName(std::string_view name) {
-    static const auto* exact = [] {
-        auto* map = new std::unordered_map<std::string_view, const Entity*>;
+    static const auto exact = [] {
+        std::unordered_map<std::string_view, const Entity*> map;
         for (const Entity& entity : kEntities)
-            map->emplace(entity.name, &entity);
+            map.emplace(entity.name, &entity);
         return map;
     }();
-    if (const auto found = exact->find(name); found != exact->end())
+    if (const auto found = exact.find(name); found != exact.end())
         return found->second;
     for (const Entity& entity : kEntities)
         if (entity.name.size() == name.size() && text::EqualsIgnoringCase(entity.name, name))

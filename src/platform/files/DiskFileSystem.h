@@ -41,6 +41,7 @@ private:
     };
 
     std::string Resolve(const std::string& path);
+    std::string ResolveBelow(std::string folder, const std::vector<std::string>& parts);
     std::string FindName(const std::string& folder, const std::string& name);
     Listing& ListingOf(const std::string& folder, const std::timespec& modified);
     void NoteEntry(const std::string& nativePath, bool present);

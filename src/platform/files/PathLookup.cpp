@@ -69,23 +69,26 @@ std::string DiskFileSystem::MapDrive(const std::string& path) const {
 std::string DiskFileSystem::Resolve(const std::string& path) {
     const std::string root = MapDrive(path);
     const auto parts = Parts(HasDrive(path) ? std::string_view(path).substr(2) : std::string_view(path));
-    std::string direct = root;
-    for (const auto& part : parts)
-        direct = JoinNative(direct, part);
-    if (Exists(direct))
-        return direct;
+    std::string folder = root;
+    for (std::size_t i = 0; i + 1 < parts.size(); ++i)
+        folder = JoinNative(folder, parts[i]);
+    if (parts.empty() || Exists(JoinNative(folder, parts.back())))
+        return parts.empty() ? root : JoinNative(folder, parts.back());
+    // Mostly the folder stands as it is written and only the file is missing.
+    if (Exists(folder))
+        return ResolveBelow(folder, {parts.back()});
+    return ResolveBelow(root, parts);
+}
 
-    std::string found = root;
-    for (std::size_t i = 0; i < parts.size(); ++i) {
-        const std::string name = FindName(found, parts[i]);
-        found = JoinNative(found, name.empty() ? parts[i] : name);
-        if (name.empty()) {
-            // Nothing below a missing entry can be found; the rest stays as it is written.
-            for (++i; i < parts.size(); ++i)
-                found = JoinNative(found, parts[i]);
-        }
+/// Part by part; what is missing stays as it is written.
+std::string DiskFileSystem::ResolveBelow(std::string folder, const std::vector<std::string>& parts) {
+    bool missing = false;
+    for (const auto& part : parts) {
+        const std::string name = missing ? std::string() : FindName(folder, part);
+        missing = name.empty();
+        folder = JoinNative(folder, missing ? part : name);
     }
-    return found;
+    return folder;
 }
 
 /// The entry's own name; empty when the folder has none of that name in any case.

@@ -9,6 +9,12 @@
 
 namespace tovimar::text {
 
+struct ConverterCloser {
+    void operator()(UConverter* converter) const { ucnv_close(converter); }
+};
+
+using Converter = std::unique_ptr<UConverter, ConverterCloser>;
+
 /// One code page. Single-byte pages have whole tables in both directions, the others a converter.
 struct CodePageTable {
     bool singleByte = false;
@@ -16,16 +22,10 @@ struct CodePageTable {
     std::array<char32_t, 256> toUnicode{};
     /// Byte by code unit; 0 for none but the code point 0.
     std::vector<std::uint8_t> fromUnicode;
-    UConverter* converter = nullptr;
+    Converter converter;
 };
 
 namespace {
-
-struct ConverterCloser {
-    void operator()(UConverter* converter) const { ucnv_close(converter); }
-};
-
-using Converter = std::unique_ptr<UConverter, ConverterCloser>;
 
 Converter OpenConverter(const std::string& name) {
     UErrorCode status = U_ZERO_ERROR;
@@ -83,7 +83,7 @@ std::unique_ptr<CodePageTable> MakeTable(int number) {
     if (ucnv_getMaxCharSize(converter.get()) == 1)
         FillTables(*table, converter.get());
     else
-        table->converter = converter.release();
+        table->converter = std::move(converter);
     return table;
 }
 
@@ -140,8 +140,8 @@ CodePage::CodePage(int number) : number_(number), table_(TableOf(number_)) {}
 std::string CodePage::Decode(std::string_view bytes) const {
     if (table_->utf8)
         return MakeValidUtf8(bytes);
-    if (table_->converter != nullptr)
-        return DecodeMultiByte(table_->converter, bytes);
+    if (table_->converter)
+        return DecodeMultiByte(table_->converter.get(), bytes);
     std::string out;
     out.reserve(bytes.size());
     for (const char byte : bytes)
@@ -163,7 +163,7 @@ std::string CodePage::Encode(std::string_view text, std::string_view substitute)
         else if (table_->singleByte)
             out += static_cast<char>(table_->fromUnicode[codePoint]);
         else
-            out += EncodeOne(table_->converter, codePoint);
+            out += EncodeOne(table_->converter.get(), codePoint);
     }
     return out;
 }
@@ -173,7 +173,7 @@ bool CodePage::CanEncode(char32_t codePoint) const {
         return codePoint <= 0x10FFFF;
     if (table_->singleByte)
         return codePoint < 0x10000 && table_->fromUnicode[codePoint] != 0;
-    return !EncodeOne(table_->converter, codePoint).empty();
+    return !EncodeOne(table_->converter.get(), codePoint).empty();
 }
 
 std::uint8_t CodePage::AnsiValue(char32_t codePoint) const {
