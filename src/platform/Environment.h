@@ -172,8 +172,8 @@ std::unique_ptr<Environment> SetEnvironment(std::unique_ptr<Environment> environ
 /// Settings of the real environment. Empty fields take the platform's places: XDG_DATA_HOME,
 /// XDG_CONFIG_HOME, TMPDIR.
 struct RealEnvironmentOptions {
-    std::string dataFolder;   ///< native; holds drive C and the application data
-    std::string configFolder; ///< native; holds the registry file
+    std::string dataFolder;    ///< native; holds drive C and the application data
+    std::string configFolder;  ///< native; holds the registry file
     std::string programFolder; ///< native; the folder of the running program
 };
 /// Files on the disk, registry in an ini file, real processes and clock; message boxes answer by their
