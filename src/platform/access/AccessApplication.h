@@ -21,9 +21,9 @@ HostObject OpenAccessApplication(const std::string& nativePath);
 struct ObjectSummary {
     ObjectKind kind = ObjectKind::Form;
     std::string name;
-    std::string caption;       ///< empty where the object has none
-    bool designKnown = true;   ///< false: the database gives the name only
-    std::string error;         ///< why the object can't be opened; empty for a sound one
+    std::string caption;     ///< empty where the object has none
+    bool designKnown = true; ///< false: the database gives the name only
+    std::string error;       ///< why the object can't be opened; empty for a sound one
 };
 
 struct ApplicationSummary {

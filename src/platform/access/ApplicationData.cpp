@@ -99,7 +99,8 @@ void ApplicationModel::LoadTable(Table& table) {
     if (!table.schemaPath.empty())
         MergeTableSchema(ReadText(table.schemaPath), Env().files->ToNative(table.schemaPath), definition);
     if (definition.fields.empty() && !table.dataPath.empty())
-        TakeFields(ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), 1), definition);
+        TakeFields(ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), 1),
+                   definition);
 }
 
 void ApplicationModel::LoadQuery(Query& query) {
@@ -109,7 +110,8 @@ void ApplicationModel::LoadQuery(Query& query) {
     const auto name = query.definition.name;
     const auto source = ReadText(query.path);
     const bool isExport = RecognizeExport(source) == ExportContent::Query;
-    query.definition = isExport ? ReadQueryExport(source, Env().files->ToNative(query.path)) : ParseQuerySql(source);
+    query.definition =
+        isExport ? ReadQueryExport(source, Env().files->ToNative(query.path)) : ParseQuerySql(source);
     query.definition.name = name;
 }
 
@@ -195,8 +197,8 @@ Records ApplicationModel::TableRecords(Table& table, int rows) {
 
 /// Rows only of a query that shows one source as it is: a record that the query wouldn't show is worse
 /// than sample text.
-Records ApplicationModel::QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields,
-                                       int rows, int depth) {
+Records ApplicationModel::QueryRecords(const QueryDefinition& query,
+                                       const std::vector<FieldDefinition>& fields, int rows, int depth) {
     Records records;
     for (const auto& field : fields)
         records.columns.push_back(

@@ -27,19 +27,37 @@ std::string Extension(const std::string& path) {
 }
 
 /// What a folder's name says about its files.
-enum class FolderHint { None, Forms, Reports, Queries, Macros, Modules, TableDefinitions, Tables, Relations, Images };
+enum class FolderHint {
+    None,
+    Forms,
+    Reports,
+    Queries,
+    Macros,
+    Modules,
+    TableDefinitions,
+    Tables,
+    Relations,
+    Images
+};
 
 FolderHint HintOf(const std::string& folderName) {
-    static const std::map<std::string, FolderHint> kHints = {
-        {"forms", FolderHint::Forms},           {"form", FolderHint::Forms},
-        {"reports", FolderHint::Reports},       {"report", FolderHint::Reports},
-        {"queries", FolderHint::Queries},       {"query", FolderHint::Queries},
-        {"macros", FolderHint::Macros},         {"macro", FolderHint::Macros},
-        {"scripts", FolderHint::Macros},        {"modules", FolderHint::Modules},
-        {"module", FolderHint::Modules},        {"tbldef", FolderHint::TableDefinitions},
-        {"tbldefs", FolderHint::TableDefinitions}, {"tabledefs", FolderHint::TableDefinitions},
-        {"tables", FolderHint::Tables},         {"relations", FolderHint::Relations},
-        {"images", FolderHint::Images}};
+    static const std::map<std::string, FolderHint> kHints = {{"forms", FolderHint::Forms},
+                                                             {"form", FolderHint::Forms},
+                                                             {"reports", FolderHint::Reports},
+                                                             {"report", FolderHint::Reports},
+                                                             {"queries", FolderHint::Queries},
+                                                             {"query", FolderHint::Queries},
+                                                             {"macros", FolderHint::Macros},
+                                                             {"macro", FolderHint::Macros},
+                                                             {"scripts", FolderHint::Macros},
+                                                             {"modules", FolderHint::Modules},
+                                                             {"module", FolderHint::Modules},
+                                                             {"tbldef", FolderHint::TableDefinitions},
+                                                             {"tbldefs", FolderHint::TableDefinitions},
+                                                             {"tabledefs", FolderHint::TableDefinitions},
+                                                             {"tables", FolderHint::Tables},
+                                                             {"relations", FolderHint::Relations},
+                                                             {"images", FolderHint::Images}};
     const auto found = kHints.find(text::ToLower(folderName));
     return found == kHints.end() ? FolderHint::None : found->second;
 }
@@ -131,12 +149,14 @@ std::optional<PartKind> KindOfText(const std::string& start, FolderHint hint, co
     case ExportContent::Query:
         return PartKind::Query;
     case ExportContent::Module:
-        return extension == "txt" && hint == FolderHint::None ? std::nullopt : std::optional(PartKind::Module);
+        return extension == "txt" && hint == FolderHint::None ? std::nullopt
+                                                              : std::optional(PartKind::Module);
     case ExportContent::TableSql:
         // A query may define a table; a statement alone in a folder of its own kind defines one.
         return hint == FolderHint::Queries ? PartKind::Query : PartKind::Table;
     case ExportContent::QuerySql:
-        return hint == FolderHint::Queries || extension == "qdef" ? std::optional(PartKind::Query) : std::nullopt;
+        return hint == FolderHint::Queries || extension == "qdef" ? std::optional(PartKind::Query)
+                                                                  : std::nullopt;
     case ExportContent::Json:
         return KindOfJson(start, hint);
     case ExportContent::Xml:

@@ -9,10 +9,20 @@
 namespace tovimar::platform::access {
 
 enum class PartKind {
-    Form, Report, Query, Macro, Module, Table,
-    Code,          ///< module of a form or report in a file of its own beside it
+    Form,
+    Report,
+    Query,
+    Macro,
+    Module,
+    Table,
+    Code,            ///< module of a form or report in a file of its own beside it
     TableProperties, ///< schema beside a table's statement
-    LinkedTable, Relation, TableData, Picture, PictureInfo, ProjectInfo
+    LinkedTable,
+    Relation,
+    TableData,
+    Picture,
+    PictureInfo,
+    ProjectInfo
 };
 
 struct ApplicationPart {
@@ -22,10 +32,10 @@ struct ApplicationPart {
 };
 
 struct ApplicationFolder {
-    std::string path;                    ///< Windows path without a trailing backslash
-    std::vector<ApplicationPart> parts;  ///< sorted by path without regard to case
-    std::vector<std::string> databases;  ///< Windows paths: of the folder itself first, then of its subfolders
-    std::size_t topLevelDatabases = 0;   ///< how many of them lie in the folder itself
+    std::string path;                   ///< Windows path without a trailing backslash
+    std::vector<ApplicationPart> parts; ///< sorted by path without regard to case
+    std::vector<std::string> databases; ///< Windows paths: of the folder itself first, then of its subfolders
+    std::size_t topLevelDatabases = 0;  ///< how many of them lie in the folder itself
 };
 
 /// Reads every file of the folder that may be a part, at most 20000 files, three folders deep; hidden

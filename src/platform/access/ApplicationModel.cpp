@@ -75,11 +75,14 @@ ApplicationModel::ApplicationModel(const std::string& nativePath) {
     else if (files.FileExists(path))
         OpenDatabaseFile(path);
     else
-        throw RaisedError(kFailure1, "No Access application found in " + nativePath + ".", "AccessApplication");
+        throw RaisedError(kFailure1, "No Access application found in " + nativePath + ".",
+                          "AccessApplication");
     SortNames();
-    const bool found = std::any_of(std::begin(names_), std::end(names_), [](const auto& names) { return !names.empty(); });
+    const bool found =
+        std::any_of(std::begin(names_), std::end(names_), [](const auto& names) { return !names.empty(); });
     if (!found)
-        throw RaisedError(kFailure1, "No Access application found in " + nativePath + ".", "AccessApplication");
+        throw RaisedError(kFailure1, "No Access application found in " + nativePath + ".",
+                          "AccessApplication");
 }
 
 ApplicationModel::~ApplicationModel() = default;
@@ -101,7 +104,8 @@ void ApplicationModel::OpenFolder(const std::string& path) {
         fullName_ = path + "\\" + FileNameOf(path) + ".accdb";
     for (const auto& part : folder.parts)
         TakePart(part);
-    const bool exports = std::any_of(std::begin(kindInExports_), std::end(kindInExports_), [](bool any) { return any; });
+    const bool exports =
+        std::any_of(std::begin(kindInExports_), std::end(kindInExports_), [](bool any) { return any; });
     for (std::size_t i = 0; i < folder.databases.size(); ++i) {
         try {
             TakeDatabase(folder.databases[i], i < folder.topLevelDatabases);
@@ -188,9 +192,10 @@ void ApplicationModel::TakeDatabase(const std::string& path, bool topLevel) {
     auto content = ReadDatabase(nativePath);
     TakeDatabaseTables(content, nativePath);
     for (auto& relation : content.relations) {
-        const bool known = std::any_of(relations_.begin(), relations_.end(), [&](const RelationDefinition& other) {
-            return text::EqualsIgnoringCase(other.name, relation.name);
-        });
+        const bool known =
+            std::any_of(relations_.begin(), relations_.end(), [&](const RelationDefinition& other) {
+                return text::EqualsIgnoringCase(other.name, relation.name);
+            });
         if (!known)
             relations_.push_back(std::move(relation));
     }
@@ -204,13 +209,14 @@ void ApplicationModel::TakeDatabase(const std::string& path, bool topLevel) {
         (*queries_.Find(name))->definition = std::move(query);
         (*queries_.Find(name))->loaded = true;
     }
-    for (const auto& [kind, name] : content.names) {
+    for (auto& [kind, name, properties] : content.names) {
         auto& objects = ListOf(kind);
         if (kindInExports_[IndexOf(kind)] || objects.Contains(name))
             continue;
         objects.Add(std::make_unique<Object>(), name);
         (*objects.Find(name))->name = name;
         (*objects.Find(name))->database = nativePath;
+        (*objects.Find(name))->properties = std::move(properties);
     }
 }
 
@@ -319,6 +325,11 @@ bool ApplicationModel::DesignKnown(ObjectKind kind, const std::string& name) con
     auto& self = const_cast<ApplicationModel&>(*this);
     const auto* object = self.ListOf(kind).Find(name);
     return object && !(*object)->path.empty();
+}
+
+NamedTexts ApplicationModel::DocumentProperties(ObjectKind kind, const std::string& name) const {
+    const auto* object = const_cast<ApplicationModel&>(*this).ListOf(kind).Find(name);
+    return object ? (*object)->properties : NamedTexts();
 }
 
 const Design* ApplicationModel::FindDesign(ObjectKind kind, const std::string& name) {

@@ -21,8 +21,10 @@ public:
     explicit ApplicationModel(const std::string& nativePath);
     ~ApplicationModel() override;
 
-    const std::string& FullName() const { return fullName_; } ///< Windows path of the database, may be virtual
-    const std::string& Folder() const { return folder_; }     ///< Windows path without trailing backslash
+    const std::string& FullName() const {
+        return fullName_;
+    }                                                     ///< Windows path of the database, may be virtual
+    const std::string& Folder() const { return folder_; } ///< Windows path without trailing backslash
     /// The name of the code project.
     std::string ProjectName();
 
@@ -42,6 +44,9 @@ public:
     /// Source of a module; none when there is no such module or its source isn't known.
     std::optional<std::string> ModuleCode(const std::string& name);
 
+    /// "Description" and the like of a form, report, macro or module.
+    NamedTexts DocumentProperties(ObjectKind kind, const std::string& name) const;
+
     /// Null for an unknown name. Raises 0x80040001 for a definition that can't be read.
     const TableDefinition* FindTable(const std::string& name);
     const QueryDefinition* FindQuery(const std::string& name);
@@ -59,9 +64,10 @@ public:
 private:
     struct Object {
         std::string name;
-        std::string path;     ///< Windows path of its export, empty for a database's object
+        std::string path; ///< Windows path of its export, empty for a database's object
         std::string codePath;
         std::string database; ///< native path, for objects of a database
+        NamedTexts properties;
         bool loaded = false;
         std::unique_ptr<Design> design;
         std::string error;

@@ -17,103 +17,169 @@ struct Default {
     std::string_view value;
 };
 
-constexpr Default kPlace[] = {{"Left", "0"},       {"Top", "0"}, {"Width", "1440"}, {"Height", "240"},
+constexpr Default kPlace[] = {{"Left", "0"},       {"Top", "0"}, {"Width", "1440"},   {"Height", "240"},
                               {"Visible", "True"}, {"Tag", ""},  {"DisplayWhen", "0"}};
 
-constexpr Default kFrame[] = {{"BackColor", "16777215"}, {"BackStyle", "1"},       {"BorderColor", "0"},
-                              {"OldBorderStyle", "1"},   {"BorderWidth", "0"},     {"BorderLineStyle", "1"},
-                              {"SpecialEffect", "0"},    {"BackThemeColorIndex", "-1"}, {"BackTint", "100"},
-                              {"BackShade", "100"},      {"BorderThemeColorIndex", "-1"}, {"BorderTint", "100"},
+constexpr Default kFrame[] = {{"BackColor", "16777215"},
+                              {"BackStyle", "1"},
+                              {"BorderColor", "0"},
+                              {"OldBorderStyle", "1"},
+                              {"BorderWidth", "0"},
+                              {"BorderLineStyle", "1"},
+                              {"SpecialEffect", "0"},
+                              {"BackThemeColorIndex", "-1"},
+                              {"BackTint", "100"},
+                              {"BackShade", "100"},
+                              {"BorderThemeColorIndex", "-1"},
+                              {"BorderTint", "100"},
                               {"BorderShade", "100"}};
 
-constexpr Default kFont[] = {{"FontName", "MS Sans Serif"}, {"FontSize", "8"},      {"FontWeight", "400"},
-                             {"FontItalic", "False"},       {"FontUnderline", "False"}, {"ForeColor", "0"},
-                             {"TextAlign", "0"},            {"ThemeFontIndex", "-1"},
-                             {"ForeThemeColorIndex", "-1"}, {"ForeTint", "100"},    {"ForeShade", "100"}};
+constexpr Default kFont[] = {
+    {"FontName", "MS Sans Serif"}, {"FontSize", "8"},   {"FontWeight", "400"}, {"FontItalic", "False"},
+    {"FontUnderline", "False"},    {"ForeColor", "0"},  {"TextAlign", "0"},    {"ThemeFontIndex", "-1"},
+    {"ForeThemeColorIndex", "-1"}, {"ForeTint", "100"}, {"ForeShade", "100"}};
 
-constexpr Default kHelp[] = {{"ControlTipText", ""}, {"HelpContextId", "0"}, {"OnClick", ""}, {"OnDblClick", ""},
-                             {"OnMouseDown", ""},    {"OnMouseMove", ""},    {"OnMouseUp", ""}};
+constexpr Default kHelp[] = {{"ControlTipText", ""}, {"HelpContextId", "0"}, {"OnClick", ""},
+                             {"OnDblClick", ""},     {"OnMouseDown", ""},    {"OnMouseMove", ""},
+                             {"OnMouseUp", ""}};
 
-constexpr Default kFocus[] = {{"StatusBarText", ""}, {"TabIndex", "0"}, {"TabStop", "True"}, {"Enabled", "True"},
-                              {"OnEnter", ""},       {"OnExit", ""},    {"OnGotFocus", ""},  {"OnLostFocus", ""}};
+constexpr Default kFocus[] = {{"StatusBarText", ""}, {"TabIndex", "0"},  {"TabStop", "True"},
+                              {"Enabled", "True"},   {"OnEnter", ""},    {"OnExit", ""},
+                              {"OnGotFocus", ""},    {"OnLostFocus", ""}};
 
-constexpr Default kData[] = {{"ControlSource", ""}, {"DefaultValue", ""},   {"ValidationRule", ""},
-                             {"ValidationText", ""}, {"Locked", "False"},   {"BeforeUpdate", ""},
+constexpr Default kData[] = {{"ControlSource", ""},  {"DefaultValue", ""}, {"ValidationRule", ""},
+                             {"ValidationText", ""}, {"Locked", "False"},  {"BeforeUpdate", ""},
                              {"AfterUpdate", ""}};
 
 constexpr Default kColumn[] = {{"ColumnWidth", "-1"}, {"ColumnOrder", "0"}, {"ColumnHidden", "False"}};
 
-constexpr Default kTextEntry[] = {{"Format", ""},        {"InputMask", ""},     {"DecimalPlaces", "255"},
-                                  {"CanGrow", "False"},  {"CanShrink", "False"}, {"ScrollBars", "0"},
-                                  {"OnChange", ""},      {"OnKeyDown", ""},     {"OnKeyPress", ""},
+constexpr Default kTextEntry[] = {{"Format", ""},       {"InputMask", ""},      {"DecimalPlaces", "255"},
+                                  {"CanGrow", "False"}, {"CanShrink", "False"}, {"ScrollBars", "0"},
+                                  {"OnChange", ""},     {"OnKeyDown", ""},      {"OnKeyPress", ""},
                                   {"OnKeyUp", ""}};
 
-constexpr Default kList[] = {{"RowSourceType", "Table/Query"}, {"RowSource", ""},       {"ColumnCount", "1"},
-                             {"ColumnWidths", ""},             {"ColumnHeads", "False"}, {"BoundColumn", "1"}};
+constexpr Default kList[] = {
+    {"RowSourceType", "Table/Query"}, {"RowSource", ""},   {"ColumnCount", "1"}, {"ColumnWidths", ""},
+    {"ColumnHeads", "False"},         {"BoundColumn", "1"}};
 
-constexpr Default kComboOwn[] = {{"ListRows", "8"}, {"ListWidth", "0"}, {"LimitToList", "False"},
-                                 {"AutoExpand", "True"}, {"OnNotInList", ""}};
+constexpr Default kComboOwn[] = {{"ListRows", "8"},
+                                 {"ListWidth", "0"},
+                                 {"LimitToList", "False"},
+                                 {"AutoExpand", "True"},
+                                 {"OnNotInList", ""}};
 
 constexpr Default kCaption[] = {{"Caption", ""}};
 
-constexpr Default kPicture[] = {{"Picture", ""}, {"PictureType", "0"}, {"PictureAlignment", "2"},
-                                {"SizeMode", "0"}, {"PictureTiling", "False"}};
+constexpr Default kPicture[] = {{"Picture", ""},
+                                {"PictureType", "0"},
+                                {"PictureAlignment", "2"},
+                                {"SizeMode", "0"},
+                                {"PictureTiling", "False"}};
 
 constexpr Default kLabelOwn[] = {{"OldBorderStyle", "0"}};
 
-constexpr Default kButtonOwn[] = {{"Height", "360"},     {"FontSize", "10"},     {"FontWeight", "700"},
-                                  {"Default", "False"},  {"Cancel", "False"},    {"AutoRepeat", "False"},
+constexpr Default kButtonOwn[] = {{"Height", "360"},       {"FontSize", "10"},  {"FontWeight", "700"},
+                                  {"Default", "False"},    {"Cancel", "False"}, {"AutoRepeat", "False"},
                                   {"Transparent", "False"}};
 
 constexpr Default kCheckOwn[] = {{"Width", "260"}, {"Height", "240"}, {"OptionValue", "0"}};
-constexpr Default kToggleOwn[] = {{"Height", "360"}, {"FontSize", "10"}, {"FontWeight", "700"}, {"OptionValue", "0"}};
+constexpr Default kToggleOwn[] = {
+    {"Height", "360"}, {"FontSize", "10"}, {"FontWeight", "700"}, {"OptionValue", "0"}};
 constexpr Default kLineOwn[] = {{"LineSlant", "False"}, {"Height", "0"}};
 
 constexpr Default kSubformOwn[] = {{"SourceObject", ""}, {"LinkChildFields", ""}, {"LinkMasterFields", ""},
                                    {"Locked", "False"},  {"CanGrow", "False"},    {"CanShrink", "False"}};
 
-constexpr Default kTabOwn[] = {{"TabFixedHeight", "0"}, {"TabFixedWidth", "0"}, {"MultiRow", "False"},
-                               {"Style", "0"},          {"OnChange", ""}};
+constexpr Default kTabOwn[] = {
+    {"TabFixedHeight", "0"}, {"TabFixedWidth", "0"}, {"MultiRow", "False"}, {"Style", "0"}, {"OnChange", ""}};
 constexpr Default kPageOwn[] = {{"StatusBarText", ""}, {"Enabled", "True"}};
 constexpr Default kObjectOwn[] = {{"Class", ""}, {"OLEClass", ""}};
 
-constexpr Default kWindow[] = {
-    {"Caption", ""},          {"RecordSource", ""},  {"Filter", ""},        {"OrderBy", ""},
-    {"Width", "5000"},        {"HelpFile", ""},      {"HelpContextId", "0"}, {"PopUp", "False"},
-    {"Modal", "False"},       {"BorderStyle", "2"},  {"AutoCenter", "False"}, {"AutoResize", "True"},
-    {"ControlBox", "True"},   {"MinButton", "True"}, {"MaxButton", "True"}, {"CloseButton", "True"},
-    {"ViewsAllowed", "0"},    {"GridX", "10"},       {"GridY", "12"},       {"Picture", ""},
-    {"PictureType", "0"},     {"PictureTiling", "False"}, {"PictureAlignment", "0"}, {"Tag", ""},
-    {"OnOpen", ""},           {"OnClose", ""},       {"OnLoad", ""},        {"OnUnload", ""},
-    {"OnActivate", ""},       {"OnDeactivate", ""},  {"OnError", ""},       {"OnResize", ""},
-    {"ShortcutMenu", "True"}, {"Toolbar", ""},       {"MenuBar", ""},       {"ShortcutMenuBar", ""},
-    {"Visible", "True"},      {"OnTimer", ""},       {"TimerInterval", "0"}, {"FilterOn", "False"},
-    {"OrderByOn", "False"},   {"FilterOnLoad", "False"}, {"OrderByOnLoad", "True"}};
+constexpr Default kWindow[] = {{"Caption", ""},
+                               {"RecordSource", ""},
+                               {"Filter", ""},
+                               {"OrderBy", ""},
+                               {"Width", "5000"},
+                               {"HelpFile", ""},
+                               {"HelpContextId", "0"},
+                               {"PopUp", "False"},
+                               {"Modal", "False"},
+                               {"BorderStyle", "2"},
+                               {"AutoCenter", "False"},
+                               {"AutoResize", "True"},
+                               {"ControlBox", "True"},
+                               {"MinButton", "True"},
+                               {"MaxButton", "True"},
+                               {"CloseButton", "True"},
+                               {"ViewsAllowed", "0"},
+                               {"GridX", "10"},
+                               {"GridY", "12"},
+                               {"Picture", ""},
+                               {"PictureType", "0"},
+                               {"PictureTiling", "False"},
+                               {"PictureAlignment", "0"},
+                               {"Tag", ""},
+                               {"OnOpen", ""},
+                               {"OnClose", ""},
+                               {"OnLoad", ""},
+                               {"OnUnload", ""},
+                               {"OnActivate", ""},
+                               {"OnDeactivate", ""},
+                               {"OnError", ""},
+                               {"OnResize", ""},
+                               {"ShortcutMenu", "True"},
+                               {"Toolbar", ""},
+                               {"MenuBar", ""},
+                               {"ShortcutMenuBar", ""},
+                               {"Visible", "True"},
+                               {"OnTimer", ""},
+                               {"TimerInterval", "0"},
+                               {"FilterOn", "False"},
+                               {"OrderByOn", "False"},
+                               {"FilterOnLoad", "False"},
+                               {"OrderByOnLoad", "True"}};
 
-constexpr Default kFormOwn[] = {
-    {"DefaultView", "1"},       {"RecordSelectors", "True"}, {"NavigationButtons", "True"},
-    {"DividingLines", "True"},  {"ScrollBars", "3"},         {"AllowEdits", "True"},
-    {"AllowAdditions", "True"}, {"AllowDeletions", "True"},  {"AllowFilters", "True"},
-    {"DataEntry", "False"},     {"Cycle", "0"},              {"AllowFormView", "True"},
-    {"AllowDatasheetView", "True"}, {"AllowLayoutView", "True"}, {"DatasheetFontName", "MS Sans Serif"},
-    {"DatasheetFontHeight", "8"}, {"DatasheetBackColor", "16777215"}, {"OnCurrent", ""},
-    {"BeforeInsert", ""},       {"AfterInsert", ""},         {"BeforeUpdate", ""},
-    {"AfterUpdate", ""},        {"OnDelete", ""},            {"OnDirty", ""},
-    {"KeyPreview", "False"},    {"WhatsThisButton", "False"}};
+constexpr Default kFormOwn[] = {{"DefaultView", "1"},
+                                {"RecordSelectors", "True"},
+                                {"NavigationButtons", "True"},
+                                {"DividingLines", "True"},
+                                {"ScrollBars", "3"},
+                                {"AllowEdits", "True"},
+                                {"AllowAdditions", "True"},
+                                {"AllowDeletions", "True"},
+                                {"AllowFilters", "True"},
+                                {"DataEntry", "False"},
+                                {"Cycle", "0"},
+                                {"AllowFormView", "True"},
+                                {"AllowDatasheetView", "True"},
+                                {"AllowLayoutView", "True"},
+                                {"DatasheetFontName", "MS Sans Serif"},
+                                {"DatasheetFontHeight", "8"},
+                                {"DatasheetBackColor", "16777215"},
+                                {"OnCurrent", ""},
+                                {"BeforeInsert", ""},
+                                {"AfterInsert", ""},
+                                {"BeforeUpdate", ""},
+                                {"AfterUpdate", ""},
+                                {"OnDelete", ""},
+                                {"OnDirty", ""},
+                                {"KeyPreview", "False"},
+                                {"WhatsThisButton", "False"}};
 
-constexpr Default kReportOwn[] = {{"DefaultView", "1"}, {"PageHeader", "0"}, {"PageFooter", "0"},
+constexpr Default kReportOwn[] = {{"DefaultView", "1"},  {"PageHeader", "0"},      {"PageFooter", "0"},
                                   {"DateGrouping", "1"}, {"GrpKeepTogether", "0"}, {"OnPage", ""},
                                   {"OnNoData", ""}};
 
-constexpr Default kSection[] = {{"Height", "0"},        {"Visible", "True"},     {"BackColor", "16777215"},
-                                {"SpecialEffect", "0"}, {"KeepTogether", "False"}, {"CanGrow", "False"},
-                                {"CanShrink", "False"}, {"ForceNewPage", "0"},   {"RepeatSection", "False"},
-                                {"DisplayWhen", "0"},   {"BreakLevel", "0"},     {"BackThemeColorIndex", "-1"},
-                                {"BackTint", "100"},    {"BackShade", "100"},    {"AlternateBackThemeColorIndex", "-1"},
-                                {"OnClick", ""},        {"OnFormat", ""},        {"OnPrint", ""}};
+constexpr Default kSection[] = {
+    {"Height", "0"},        {"Visible", "True"},       {"BackColor", "16777215"},
+    {"SpecialEffect", "0"}, {"KeepTogether", "False"}, {"CanGrow", "False"},
+    {"CanShrink", "False"}, {"ForceNewPage", "0"},     {"RepeatSection", "False"},
+    {"DisplayWhen", "0"},   {"BreakLevel", "0"},       {"BackThemeColorIndex", "-1"},
+    {"BackTint", "100"},    {"BackShade", "100"},      {"AlternateBackThemeColorIndex", "-1"},
+    {"OnClick", ""},        {"OnFormat", ""},          {"OnPrint", ""}};
 
-constexpr Default kBreakLevel[] = {{"ControlSource", ""}, {"SortOrder", "False"}, {"GroupHeader", "False"},
-                                   {"GroupFooter", "False"}, {"GroupOn", "0"},    {"GroupInterval", "1"},
+constexpr Default kBreakLevel[] = {{"ControlSource", ""},    {"SortOrder", "False"}, {"GroupHeader", "False"},
+                                   {"GroupFooter", "False"}, {"GroupOn", "0"},       {"GroupInterval", "1"},
                                    {"KeepTogether", "0"}};
 
 using Groups = std::vector<std::span<const Default>>;
@@ -133,10 +199,12 @@ Groups GroupsOf(std::string& folded) {
         return {kPlace, kFrame, kFont, kHelp, kFocus, kCaption, kPicture, kButtonOwn};
     if (folded == "togglebutton")
         return {kPlace, kFrame, kFont, kHelp, kFocus, kData, kCaption, kPicture, kToggleOwn};
-    if (folded == "checkbox" || folded == "optionbutton")
+    if (folded == "checkbox")
         return {kPlace, kFrame, kHelp, kFocus, kData, kColumn, kCheckOwn};
+    if (folded == "optionbutton")
+        return {kPlace, kFrame, kHelp, kFocus, kData, kCheckOwn};
     if (folded == "optiongroup")
-        return {kPlace, kFrame, kHelp, kFocus, kData};
+        return {kPlace, kFrame, kHelp, kFocus, kData, kColumn};
     if (folded == "boundobjectframe" || folded == "attachment")
         return {kPlace, kFrame, kHelp, kFocus, kData, kColumn, kPicture, kObjectOwn};
     if (folded == "unboundobjectframe" || folded == "chart" || folded == "customcontrol")

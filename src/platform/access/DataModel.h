@@ -11,8 +11,21 @@ namespace tovimar::platform::access {
 
 /// The data access library's numbers.
 enum class FieldType : std::int32_t {
-    Boolean = 1, Byte = 2, Integer = 3, Long = 4, Currency = 5, Single = 6, Double = 7, Date = 8,
-    Binary = 9, Text = 10, LongBinary = 11, Memo = 12, Guid = 15, BigInt = 16, Decimal = 20,
+    Boolean = 1,
+    Byte = 2,
+    Integer = 3,
+    Long = 4,
+    Currency = 5,
+    Single = 6,
+    Double = 7,
+    Date = 8,
+    Binary = 9,
+    Text = 10,
+    LongBinary = 11,
+    Memo = 12,
+    Guid = 15,
+    BigInt = 16,
+    Decimal = 20,
     Attachment = 101
 };
 
@@ -23,13 +36,13 @@ std::optional<std::string> FindNamedText(const NamedTexts& texts, std::string_vi
 struct FieldDefinition {
     std::string name;
     FieldType type = FieldType::Text;
-    std::int32_t size = 0;          ///< bytes or characters, 0 where it isn't told
+    std::int32_t size = 0; ///< bytes or characters, 0 where it isn't told
     bool autoNumber = false;
     bool required = false;
     bool inPrimaryKey = false;
     /// Where a query's field comes from; both empty for a calculated field.
     std::string sourceField, sourceTable;
-    NamedTexts properties;          ///< "Description", "Caption", "Format", ...
+    NamedTexts properties; ///< "Description", "Caption", "Format", ...
 };
 
 struct IndexDefinition {
@@ -43,8 +56,8 @@ struct TableDefinition {
     std::string name;
     std::vector<FieldDefinition> fields;
     std::vector<IndexDefinition> indexes;
-    std::string connect;            ///< empty for a local table
-    std::string sourceTable;        ///< of a linked table
+    std::string connect;     ///< empty for a local table
+    std::string sourceTable; ///< of a linked table
     std::int32_t attributes = 0;
     NamedTexts properties;
 };
@@ -52,28 +65,28 @@ struct TableDefinition {
 /// A query as its design grid has it. For a query known by its statement alone, `sql` is parsed.
 struct QueryDefinition {
     struct Input {
-        std::string table;          ///< table or query, or "" for a nested statement
-        std::string alias;          ///< the table's name where none is given
+        std::string table; ///< table or query, or "" for a nested statement
+        std::string alias; ///< the table's name where none is given
     };
     struct Column {
-        std::string expression;     ///< "Orders.Total", "Orders.*", "[a]+[b]"
+        std::string expression; ///< "Orders.Total", "Orders.*", "[a]+[b]"
         std::string alias;
     };
     std::string name;
     /// 1 select, 2 make-table, 3 append, 4 update, 5 delete, 6 crosstab, 7 data definition,
     /// 8 pass-through, 9 union.
     int operation = 1;
-    std::string sql;                ///< empty where the source has only the grid
+    std::string sql; ///< empty where the source has only the grid
     std::vector<Input> inputs;
     std::vector<Column> columns;
-    bool allFields = false;         ///< every field of every input as well
-    bool filtered = false;          ///< has a condition, grouping, order or limit
+    bool allFields = false; ///< every field of every input as well
+    bool filtered = false;  ///< has a condition, grouping, order or limit
     NamedTexts properties;
 };
 
 struct RelationDefinition {
     std::string name, table, foreignTable;
-    std::int32_t attributes = 0;    ///< bit 1: one to one
+    std::int32_t attributes = 0;                             ///< bit 1: one to one
     std::vector<std::pair<std::string, std::string>> fields; ///< name, foreign name
 };
 

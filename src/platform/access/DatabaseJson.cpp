@@ -6,16 +6,17 @@
 
 namespace tovimar::platform::access {
 
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(FieldDefinition, name, type, size, autoNumber, required, inPrimaryKey, sourceField,
-                                   sourceTable, properties)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(FieldDefinition, name, type, size, autoNumber, required, inPrimaryKey,
+                                   sourceField, sourceTable, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(IndexDefinition, name, primary, unique, fields)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(TableDefinition, name, fields, indexes, connect, sourceTable, attributes,
                                    properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Input, table, alias)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Column, expression, alias)
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition, name, operation, sql, inputs, columns, allFields, filtered,
-                                   properties)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition, name, operation, sql, inputs, columns, allFields,
+                                   filtered, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(RelationDefinition, name, table, foreignTable, attributes, fields)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(NamedObject, kind, name, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(DatabaseContent, tables, queries, relations, names)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(Records::Column, name, type)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(Records, columns, rows)
@@ -32,7 +33,8 @@ template <typename T> T FromJson(const std::string& bytes) {
     try {
         return Json::parse(bytes).get<T>();
     } catch (const Json::exception& failure) {
-        throw RaisedError(kFailure1, std::string("The database can't be read: ") + failure.what(), "DatabaseReader");
+        throw RaisedError(kFailure1, std::string("The database can't be read: ") + failure.what(),
+                          "DatabaseReader");
     }
 }
 

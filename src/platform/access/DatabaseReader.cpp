@@ -146,22 +146,12 @@ private:
     }
 
     void TakeName(const std::string& name, std::int16_t type) {
-        switch (type) {
-        case -32768:
-            content_.names.emplace_back(ObjectKind::Form, name);
-            break;
-        case -32764:
-            content_.names.emplace_back(ObjectKind::Report, name);
-            break;
-        case -32766:
-            content_.names.emplace_back(ObjectKind::Macro, name);
-            break;
-        case -32761:
-            content_.names.emplace_back(ObjectKind::Module, name);
-            break;
-        default:
-            break;
-        }
+        static const std::map<int, ObjectKind> kKinds = {{-32768, ObjectKind::Form},
+                                                         {-32764, ObjectKind::Report},
+                                                         {-32766, ObjectKind::Macro},
+                                                         {-32761, ObjectKind::Module}};
+        if (const auto kind = kKinds.find(type); kind != kKinds.end())
+            content_.names.push_back({kind->second, name, file_.Properties(name).own});
     }
 
     /// One row per part of a query's design; the attribute tells which part.
@@ -201,8 +191,8 @@ private:
     }
 
     /// A union's parts stand as whole statements; the first one names the fields.
-    static void TakeQueryInput(QueryDefinition& query, const std::string& expression, const std::string& table,
-                               const std::string& alias) {
+    static void TakeQueryInput(QueryDefinition& query, const std::string& expression,
+                               const std::string& table, const std::string& alias) {
         if (query.operation == 9 && table.empty()) {
             query.sql += (query.sql.empty() ? "" : " UNION ") + expression;
             return;
@@ -278,7 +268,8 @@ std::string ReadableCell(const std::string& cell, Records::Type type) {
     case Records::Type::DateTime:
         return cell.empty() ? cell : ReadableDate(cell);
     case Records::Type::Currency:
-        return cell.ends_with("00") && cell.find('.') != std::string::npos ? cell.substr(0, cell.size() - 2) : cell;
+        return cell.ends_with("00") && cell.find('.') != std::string::npos ? cell.substr(0, cell.size() - 2)
+                                                                           : cell;
     case Records::Type::Binary:
         return {};
     default:
@@ -326,7 +317,8 @@ DatabaseContent ReadDatabase(const std::string& nativePath) {
 }
 
 Records ReadTableRecords(const std::string& nativePath, const std::string& table, int rows) {
-    return RecordsFromJson(RunGuarded(nativePath, [&] { return RecordsToJson(ReadRecords(nativePath, table, rows)); }));
+    return RecordsFromJson(
+        RunGuarded(nativePath, [&] { return RecordsToJson(ReadRecords(nativePath, table, rows)); }));
 }
 
 } // namespace tovimar::platform::access

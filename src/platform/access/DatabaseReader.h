@@ -5,19 +5,24 @@
 #include "platform/access/OpenObject.h"
 
 #include <string>
-#include <utility>
 #include <vector>
 
 /// Reads .mdb and .accdb files. The reader library trusts its input, so it works in a child process with
 /// bounded time and memory: whatever a damaged file does to it ends as an error here.
 namespace tovimar::platform::access {
 
+/// A form, report, macro or module, of which the design isn't read.
+struct NamedObject {
+    ObjectKind kind = ObjectKind::Form;
+    std::string name;
+    NamedTexts properties; ///< "Description" and the like
+};
+
 struct DatabaseContent {
-    std::vector<TableDefinition> tables;     ///< user tables and linked ones
+    std::vector<TableDefinition> tables; ///< user tables and linked ones
     std::vector<QueryDefinition> queries;
     std::vector<RelationDefinition> relations;
-    /// Forms, reports, macros and modules, of which the name is known.
-    std::vector<std::pair<ObjectKind, std::string>> names;
+    std::vector<NamedObject> names;
 };
 
 /// Raises 0x80040001 "<path>: <reason>" for a file that can't be read as a database.

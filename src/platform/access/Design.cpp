@@ -112,8 +112,9 @@ std::vector<SectionRef> Design::Sections() const {
         if (number >= 0 && !known)
             sections.push_back({number, child.get()});
     }
-    std::stable_sort(sections.begin(), sections.end(),
-                     [](const SectionRef& left, const SectionRef& right) { return left.number < right.number; });
+    std::stable_sort(sections.begin(), sections.end(), [](const SectionRef& left, const SectionRef& right) {
+        return left.number < right.number;
+    });
     return sections;
 }
 

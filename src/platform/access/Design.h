@@ -36,8 +36,8 @@ public:
     std::string type;
     /// Property "Name"; made up as the type and a number where the source has none.
     std::string name;
-    DesignObject* parent = nullptr;            ///< not owned; null for the root
-    const DesignObject* prototype = nullptr;   ///< not owned; defaults of the kind within this form
+    DesignObject* parent = nullptr;                      ///< not owned; null for the root
+    const DesignObject* prototype = nullptr;             ///< not owned; defaults of the kind within this form
     std::vector<std::unique_ptr<DesignObject>> children; ///< in the order of the source, which is z-order
 
     /// Own properties, in the order of the source. Names ignore case; the first of a name counts.
@@ -75,11 +75,11 @@ struct SectionRef {
 
 struct Design {
     ObjectKind kind = ObjectKind::Form;
-    std::string name;                       ///< of the object in the application
-    std::unique_ptr<DesignObject> root;     ///< null for a name without a design
+    std::string name;                   ///< of the object in the application
+    std::unique_ptr<DesignObject> root; ///< null for a name without a design
     std::vector<std::unique_ptr<DesignObject>> prototypes;
-    std::string code;                       ///< source of the module behind it, CRLF or LF; empty without one
-    std::string sourceFile;                 ///< native path it was read from, for messages
+    std::string code;       ///< source of the module behind it, CRLF or LF; empty without one
+    std::string sourceFile; ///< native path it was read from, for messages
 
     /// In the order of the numbers.
     std::vector<SectionRef> Sections() const;

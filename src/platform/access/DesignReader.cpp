@@ -62,8 +62,8 @@ private:
 
 void TakePrototypes(Design& design) {
     auto& children = design.root->children;
-    const auto inRoot = std::stable_partition(
-        children.begin(), children.end(), [](const auto& child) { return BelongsToRoot(*child); });
+    const auto inRoot = std::stable_partition(children.begin(), children.end(),
+                                              [](const auto& child) { return BelongsToRoot(*child); });
     for (auto child = inRoot; child != children.end(); ++child) {
         (*child)->parent = nullptr;
         (*child)->name = (*child)->type;

@@ -59,8 +59,9 @@ private:
         position_ = end + 1;
         ++lineNumber_;
         const auto first = line_.find_first_not_of(" \t\r");
-        line_ = first == std::string_view::npos ? std::string_view()
-                                                : line_.substr(first, line_.find_last_not_of(" \t\r") - first + 1);
+        line_ = first == std::string_view::npos
+                    ? std::string_view()
+                    : line_.substr(first, line_.find_last_not_of(" \t\r") - first + 1);
         return true;
     }
 
@@ -163,7 +164,8 @@ private:
             out += rest[0];
             return 1;
         }
-        const auto code = static_cast<unsigned char>((rest[0] - '0') * 64 + (rest[1] - '0') * 8 + rest[2] - '0');
+        const auto code =
+            static_cast<unsigned char>((rest[0] - '0') * 64 + (rest[1] - '0') * 8 + rest[2] - '0');
         if (code < 0x80)
             out += static_cast<char>(code);
         else

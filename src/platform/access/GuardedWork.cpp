@@ -86,7 +86,8 @@ std::string ReadAnswer(int descriptor) {
     std::string answer;
     std::string buffer(std::size_t{1} << 16, '\0');
     for (;;) {
-        const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now()).count();
+        const auto left =
+            std::chrono::duration_cast<std::chrono::milliseconds>(deadline - Clock::now()).count();
         pollfd waiting{descriptor, POLLIN, 0};
         const int ready = left > 0 ? ::poll(&waiting, 1, static_cast<int>(left)) : 0;
         if (ready < 0 && errno == EINTR)
@@ -124,7 +125,8 @@ std::string RunGuarded(const std::string& nativePath, const std::function<std::s
     }
     const char end = answer.empty() ? '\0' : answer.back();
     if (end != kDone && end != kFailed)
-        throw RaisedError(kFailure1, nativePath + ": the file is damaged and can't be read.", "DatabaseReader");
+        throw RaisedError(kFailure1, nativePath + ": the file is damaged and can't be read.",
+                          "DatabaseReader");
     answer.pop_back();
     if (end == kFailed)
         throw RaisedError(kFailure1, answer, "DatabaseReader");

@@ -3,8 +3,8 @@
 #include "platform/Error.h"
 #include "platform/text/Text.h"
 
-#include <array>
 #include <algorithm>
+#include <array>
 #include <fstream>
 #include <mdbtools.h>
 
@@ -48,7 +48,8 @@ MdbColumn* ColumnAt(const MdbTableDef* table, unsigned int index) {
 }
 
 void CopyText(gpointer key, gpointer value, gpointer texts) {
-    static_cast<NamedTexts*>(texts)->emplace_back(static_cast<const char*>(key), static_cast<const char*>(value));
+    static_cast<NamedTexts*>(texts)->emplace_back(static_cast<const char*>(key),
+                                                  static_cast<const char*>(value));
 }
 
 NamedTexts CopyTexts(const MdbProperties* properties) {
@@ -144,7 +145,8 @@ MdbFile::MdbFile(const std::string& nativePath) : handle_(std::make_unique<Handl
         handle_->mdb = nullptr;
     }
     if (!handle_->mdb)
-        throw RaisedError(kFailure1, nativePath + ": the database can't be read; it may be damaged or encrypted.",
+        throw RaisedError(kFailure1,
+                          nativePath + ": the database can't be read; it may be damaged or encrypted.",
                           "DatabaseReader");
     mdb_set_bind_size(handle_->mdb, kMaxCell);
     mdb_set_date_fmt(handle_->mdb, "%Y-%m-%d %H:%M:%S");

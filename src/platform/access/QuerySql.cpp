@@ -83,7 +83,8 @@ private:
         const auto end = FindOutside({"UNION"}, select);
         next_ = std::min(select + 1, tokens_.size());
         SkipModifiers();
-        const auto listEnd = std::min(FindOutside({"FROM", "INTO", "WHERE", "ORDER", "GROUP", "UNION"}, next_), end);
+        const auto listEnd =
+            std::min(FindOutside({"FROM", "INTO", "WHERE", "ORDER", "GROUP", "UNION"}, next_), end);
         ReadColumns(next_, listEnd);
         const auto from = std::min(FindOutside({"FROM"}, listEnd), end);
         const auto clause = std::min(FindOutside({"WHERE", "GROUP", "HAVING", "ORDER", "PIVOT"}, from), end);

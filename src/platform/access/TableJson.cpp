@@ -96,7 +96,8 @@ RelationDefinition ReadLinedRelation(std::string_view source) {
 
 } // namespace
 
-TableDefinition ReadLinkedTable(std::string_view source, const std::string& name, const std::string& nativePath) {
+TableDefinition ReadLinkedTable(std::string_view source, const std::string& name,
+                                const std::string& nativePath) {
     const auto json = Parse(source, nativePath);
     const auto& items = At(json, "Items");
     TableDefinition table;

@@ -19,7 +19,8 @@ TableDefinition ReadTableSql(std::string_view text, const std::string& name);
 void MergeTableSchema(std::string_view xml, const std::string& nativePath, TableDefinition& table);
 
 /// A linked table's JSON text: connection, source and properties.
-TableDefinition ReadLinkedTable(std::string_view json, const std::string& name, const std::string& nativePath);
+TableDefinition ReadLinkedTable(std::string_view json, const std::string& name,
+                                const std::string& nativePath);
 
 /// A relation as JSON, or as lines: attributes, name, table, foreign table, and per field
 /// "Field = Begin", name, foreign name, "End".

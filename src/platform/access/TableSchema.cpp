@@ -17,19 +17,30 @@ struct JetType {
     FieldType type;
 };
 
-constexpr JetType kJetTypes[] = {
-    {"yesno", FieldType::Boolean},     {"byte", FieldType::Byte},       {"integer", FieldType::Integer},
-    {"longinteger", FieldType::Long},  {"autonumber", FieldType::Long}, {"currency", FieldType::Currency},
-    {"single", FieldType::Single},     {"double", FieldType::Double},   {"datetime", FieldType::Date},
-    {"text", FieldType::Text},         {"memo", FieldType::Memo},       {"hyperlink", FieldType::Memo},
-    {"oleobject", FieldType::LongBinary}, {"replicationid", FieldType::Guid}, {"decimal", FieldType::Decimal},
-    {"binary", FieldType::Binary},     {"complex", FieldType::Attachment}};
+constexpr JetType kJetTypes[] = {{"yesno", FieldType::Boolean},
+                                 {"byte", FieldType::Byte},
+                                 {"integer", FieldType::Integer},
+                                 {"longinteger", FieldType::Long},
+                                 {"autonumber", FieldType::Long},
+                                 {"currency", FieldType::Currency},
+                                 {"single", FieldType::Single},
+                                 {"double", FieldType::Double},
+                                 {"datetime", FieldType::Date},
+                                 {"text", FieldType::Text},
+                                 {"memo", FieldType::Memo},
+                                 {"hyperlink", FieldType::Memo},
+                                 {"oleobject", FieldType::LongBinary},
+                                 {"replicationid", FieldType::Guid},
+                                 {"decimal", FieldType::Decimal},
+                                 {"binary", FieldType::Binary},
+                                 {"complex", FieldType::Attachment}};
 
 pugi::xml_document LoadXml(std::string_view xml, const std::string& nativePath) {
     pugi::xml_document document;
     if (xml.size() > kMaxXmlBytes)
         throw RaisedError(kFailure1, nativePath + ": the file is larger than 64 MiB.", "TableReader");
-    const auto result = document.load_buffer(xml.data(), xml.size(), pugi::parse_default, pugi::encoding_utf8);
+    const auto result =
+        document.load_buffer(xml.data(), xml.size(), pugi::parse_default, pugi::encoding_utf8);
     if (!result)
         throw RaisedError(kFailure1, nativePath + ": " + result.description() + ".", "TableReader");
     return document;

@@ -14,17 +14,20 @@ struct SqlType {
     FieldType type;
 };
 
-constexpr SqlType kTypes[] = {
-    {"BIT", FieldType::Boolean},      {"YESNO", FieldType::Boolean},    {"BOOLEAN", FieldType::Boolean},
-    {"BYTE", FieldType::Byte},        {"SHORT", FieldType::Integer},    {"SMALLINT", FieldType::Integer},
-    {"INTEGER", FieldType::Long},     {"INT", FieldType::Long},         {"LONG", FieldType::Long},
-    {"AUTOINCREMENT", FieldType::Long}, {"COUNTER", FieldType::Long},   {"CURRENCY", FieldType::Currency},
-    {"MONEY", FieldType::Currency},   {"SINGLE", FieldType::Single},    {"REAL", FieldType::Single},
-    {"DOUBLE", FieldType::Double},    {"FLOAT", FieldType::Double},     {"DATETIME", FieldType::Date},
-    {"DATE", FieldType::Date},        {"BINARY", FieldType::Binary},    {"VARBINARY", FieldType::Binary},
-    {"LONGBINARY", FieldType::LongBinary}, {"LONGTEXT", FieldType::Memo}, {"MEMO", FieldType::Memo},
-    {"GUID", FieldType::Guid},        {"BIGINT", FieldType::BigInt},    {"DECIMAL", FieldType::Decimal},
-    {"NUMERIC", FieldType::Decimal}};
+constexpr SqlType kTypes[] = {{"BIT", FieldType::Boolean},      {"YESNO", FieldType::Boolean},
+                              {"BOOLEAN", FieldType::Boolean},  {"BYTE", FieldType::Byte},
+                              {"SHORT", FieldType::Integer},    {"SMALLINT", FieldType::Integer},
+                              {"INTEGER", FieldType::Long},     {"INT", FieldType::Long},
+                              {"LONG", FieldType::Long},        {"AUTOINCREMENT", FieldType::Long},
+                              {"COUNTER", FieldType::Long},     {"CURRENCY", FieldType::Currency},
+                              {"MONEY", FieldType::Currency},   {"SINGLE", FieldType::Single},
+                              {"REAL", FieldType::Single},      {"DOUBLE", FieldType::Double},
+                              {"FLOAT", FieldType::Double},     {"DATETIME", FieldType::Date},
+                              {"DATE", FieldType::Date},        {"BINARY", FieldType::Binary},
+                              {"VARBINARY", FieldType::Binary}, {"LONGBINARY", FieldType::LongBinary},
+                              {"LONGTEXT", FieldType::Memo},    {"MEMO", FieldType::Memo},
+                              {"GUID", FieldType::Guid},        {"BIGINT", FieldType::BigInt},
+                              {"DECIMAL", FieldType::Decimal},  {"NUMERIC", FieldType::Decimal}};
 
 FieldType TypeOf(const SqlToken& token) {
     for (const auto& type : kTypes)
@@ -167,7 +170,8 @@ private:
             for (auto& field : table_.fields)
                 field.inPrimaryKey =
                     field.inPrimaryKey ||
-                    (index.primary && std::any_of(index.fields.begin(), index.fields.end(), [&](const auto& name) {
+                    (index.primary &&
+                     std::any_of(index.fields.begin(), index.fields.end(), [&](const auto& name) {
                          return text::EqualsIgnoringCase(name, field.name);
                      }));
     }

@@ -1,0 +1,67 @@
+#include "platform/Error.h"
+#include "platform/access/AccessApplication.h"
+#include "platform/access/ApplicationModel.h"
+#include "platform/files/Paths.h"
+#include "platform/text/Text.h"
+
+namespace tovimar::platform::access {
+
+namespace {
+
+bool HasDesign(ObjectKind kind) {
+    return kind == ObjectKind::Form || kind == ObjectKind::Report || kind == ObjectKind::Macro;
+}
+
+ObjectSummary Summarize(ApplicationModel& model, ObjectKind kind, const std::string& name) {
+    ObjectSummary summary{kind, name, {}, true, {}};
+    if (!HasDesign(kind))
+        return summary;
+    summary.designKnown = model.DesignKnown(kind, name);
+    const auto* design = model.FindDesign(kind, name);
+    if (design && kind != ObjectKind::Macro)
+        summary.caption = text::Trim(design->root->Text("Caption"));
+    if (summary.designKnown)
+        summary.error = model.DesignError(kind, name);
+    return summary;
+}
+
+void AddNote(const std::vector<ObjectSummary>& objects, ObjectKind kind, const char* word,
+             std::vector<std::string>& notes) {
+    std::size_t unknown = 0;
+    std::size_t damaged = 0;
+    for (const auto& object : objects) {
+        unknown += object.kind == kind && !object.designKnown ? 1 : 0;
+        damaged += object.kind == kind && !object.error.empty() ? 1 : 0;
+    }
+    const auto noun = [&](std::size_t count) {
+        return std::to_string(count) + " " + word + (count == 1 ? "" : "s");
+    };
+    if (unknown > 0)
+        notes.push_back(noun(unknown) + " known by name only.");
+    if (damaged > 0)
+        notes.push_back(noun(damaged) + " can't be read.");
+}
+
+bool IsSystemTable(ObjectKind kind, const std::string& name) {
+    return kind == ObjectKind::Table && text::StartsWithIgnoringCase(name, "MSys");
+}
+
+} // namespace
+
+ApplicationSummary SummarizeApplication(const std::string& nativePath) {
+    ApplicationModel model(nativePath);
+    ApplicationSummary summary;
+    summary.fullName = model.FullName();
+    summary.name = BaseNameOf(model.FullName());
+    for (const auto kind : {ObjectKind::Table, ObjectKind::Query, ObjectKind::Form, ObjectKind::Report,
+                            ObjectKind::Macro, ObjectKind::Module})
+        for (const auto& name : model.Names(kind))
+            if (!IsSystemTable(kind, name))
+                summary.objects.push_back(Summarize(model, kind, name));
+    AddNote(summary.objects, ObjectKind::Form, "form", summary.notes);
+    AddNote(summary.objects, ObjectKind::Report, "report", summary.notes);
+    AddNote(summary.objects, ObjectKind::Macro, "macro", summary.notes);
+    return summary;
+}
+
+} // namespace tovimar::platform::access

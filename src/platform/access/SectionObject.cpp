@@ -1,0 +1,38 @@
+#include "platform/access/SectionObject.h"
+
+#include "platform/access/Collections.h"
+#include "platform/access/DesignValues.h"
+#include "platform/access/WindowObject.h"
+
+namespace tovimar::platform::access {
+
+const MemberTable<SectionObject>& SectionObject::Members() {
+    static const MemberTable<SectionObject> kMembers{{"Name", &SectionObject::ReadName},
+                                                     {"Height", &SectionObject::ReadHeight},
+                                                     {"Section", &SectionObject::ReadNumber},
+                                                     {"Properties", &SectionObject::ReadProperties}};
+    return kMembers;
+}
+
+Value SectionObject::ReadHeight(const Arguments&) {
+    const auto window = window_.lock();
+    if (!window)
+        RaiseObjectClosed(ClassName());
+    return window->SectionHeight(*design_, number_);
+}
+
+Value SectionObject::ReadOther(std::string_view name, const Arguments&) {
+    auto value = EffectiveValue(*design_, name);
+    if (!value)
+        RaiseNoSuchMember(ClassName());
+    return std::move(*value);
+}
+
+Value SectionObject::ReadProperties(const Arguments& arguments) {
+    const auto* design = design_;
+    const auto properties =
+        std::make_shared<OwnerProperties>(shared_from_this(), [design] { return PropertyNames(*design); });
+    return arguments.empty() ? ObjectValue(properties) : properties->Entry(arguments[0]);
+}
+
+} // namespace tovimar::platform::access
