@@ -59,6 +59,43 @@ Rectangle PicturePlace(const Image& image, const Rectangle& area, int sizeMode, 
     return {left, top, left + width, top + height};
 }
 
+namespace {
+
+// How a button's picture and caption stand: 0 picture alone, 2 caption below, 3 caption above, 1 and 4 the
+// caption to the right of the picture, 5 to its left.
+constexpr int kCaptionBelow = 2, kCaptionAbove = 3, kCaptionLeft = 5;
+constexpr int kPictureGap = 4;
+
+/// Picture and caption are centred together.
+Rectangle ButtonPicturePlace(const Image& image, const Rectangle& inner, int arrangement, TextSize caption) {
+    auto place = PicturePlace(image, inner, 0, 2);
+    if (arrangement == 0)
+        return place;
+    const int side = (std::min(caption.width, inner.Width() - image.width) + kPictureGap) / 2;
+    const int rise = (caption.height + kPictureGap) / 2;
+    if (arrangement == kCaptionBelow || arrangement == kCaptionAbove)
+        return Moved(place, 0, arrangement == kCaptionBelow ? -rise : rise);
+    return Moved(place, arrangement == kCaptionLeft ? side : -side, 0);
+}
+
+Rectangle BesidePicture(const Rectangle& inner, const Rectangle& picture, int arrangement) {
+    auto room = inner;
+    if (arrangement == kCaptionBelow)
+        room.top = picture.bottom;
+    else if (arrangement == kCaptionAbove)
+        room.bottom = picture.top;
+    else if (arrangement == kCaptionLeft)
+        room.right = picture.left - kPictureGap;
+    else
+        room.left = picture.right + kPictureGap;
+    // What is left at the far end of the row is the margin that the picture has at its own.
+    if (arrangement == 1 || arrangement == 4)
+        room.right = std::max(room.left, inner.right - std::max(0, picture.left - inner.left));
+    return room;
+}
+
+} // namespace
+
 void ControlPainter::PaintThemedFace(const Object& control, const Rectangle& area) {
     const auto face = DesignColor(control, "Back", SystemColor::kFace, context_.Theme());
     const bool gradient = control.Integer("Gradient", 0) != 0;
@@ -87,20 +124,18 @@ void ControlPainter::PaintButton(const Object& control, const Rectangle& area) {
     auto inner = Shrunk(area, 2);
     const auto image = PictureOf(control, context_.application, true);
     const int arrangement = control.Integer("PictureCaptionArrangement", 0);
+    auto style = StyleOf(control);
+    if (!context_.Designing() && !control.Flag("Enabled"))
+        style.color = SystemColor::kGrayText;
     if (image) {
-        const int alignment = arrangement == 4 ? 0 : control.Integer("PictureAlignment", 2);
-        auto place = PicturePlace(*image, inner, 0, arrangement == 0 ? 2 : alignment);
-        if (arrangement != 0)
-            place = Moved(place, 4, inner.top + (inner.Height() - image->height) / 2 - place.top);
+        const auto place =
+            ButtonPicturePlace(*image, inner, arrangement, MeasureText(control.Text("Caption"), style));
         const ClipTo clip(canvas_, inner);
         canvas_.Draw(*image, place);
         if (arrangement == 0)
             return;
-        inner.left = std::min(inner.right, place.right + 2);
+        inner = BesidePicture(inner, place, arrangement);
     }
-    auto style = StyleOf(control);
-    if (!context_.Designing() && !control.Flag("Enabled"))
-        style.color = SystemColor::kGrayText;
     TextPlace place{inner, Align::Center, VerticalAlign::Middle, true, true};
     DrawText(canvas_, control.Text("Caption"), style, place);
 }

@@ -72,13 +72,12 @@ bool IsContinuous(const Design& design, View view) {
 bool IsSectionShown(const Design& design, const SectionRef& section, View view) {
     if (view == View::Design)
         return true;
-    if (view == View::Datasheet && section.number != 0)
-        return false;
     const bool pageSection = section.number == 3 || section.number == 4;
     if (design.kind == access::ObjectKind::Form && pageSection)
         return false;
     const int when = section.object->Integer("DisplayWhen", 0);
-    return section.object->Flag("Visible") && when != (view == View::Preview ? kScreenOnly : kPrintOnly);
+    return access::SectionIsShown(view, section.number, section.object->Flag("Visible")) &&
+           when != (view == View::Preview ? kScreenOnly : kPrintOnly);
 }
 
 bool HasFooter(const Design& design, View view) {

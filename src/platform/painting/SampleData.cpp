@@ -80,6 +80,30 @@ std::string FieldName(std::string_view source) {
     return name;
 }
 
+/// The field of DLookup("[Title]","Settings"), whose name says what it holds.
+std::string LookedUpField(std::string_view expression) {
+    std::size_t matched = 0;
+    const auto call = text::FindIgnoringCase(expression, "DLookUp(", 0, &matched);
+    if (call == std::string_view::npos)
+        return {};
+    const auto from = expression.find('"', call + matched);
+    const auto to = from == std::string_view::npos ? from : expression.find('"', from + 1);
+    return to == std::string_view::npos ? std::string()
+                                        : FieldName(expression.substr(from + 1, to - from - 1));
+}
+
+/// "CarnivalTitle" as "Carnival Title".
+std::string Spaced(std::string_view name) {
+    std::string spaced;
+    for (const char letter : name) {
+        const bool capital = letter >= 'A' && letter <= 'Z';
+        if (capital && !spaced.empty() && spaced.back() >= 'a' && spaced.back() <= 'z')
+            spaced += ' ';
+        spaced += letter == '_' ? ' ' : letter;
+    }
+    return spaced;
+}
+
 bool IsTrueWord(const std::string& word) {
     return text::EqualsIgnoringCase(word, "True") || text::EqualsIgnoringCase(word, "Yes") || word == "-1" ||
            word == "1";
@@ -122,7 +146,9 @@ private:
         while (end < expression.size() && (std::isalnum(static_cast<unsigned char>(expression[end])) != 0))
             ++end;
         const auto word = text::FoldCase(expression.substr(at, end - at));
-        if (word == "date" || word == "now")
+        if (!word.empty() && word.find_first_not_of("0123456789") == std::string::npos)
+            result += word;
+        else if (word == "date" || word == "now")
             result += word == "now" ? "3/14/2024 9:30:00 AM" : "3/14/2024";
         else if (word == "time")
             result += "9:30:00 AM";
@@ -180,6 +206,10 @@ std::string SampleData::FieldText(const DesignObject& control, std::string_view 
             break;
         }
     }
+    // Words don't fit into a box made for a figure or two.
+    constexpr int kNarrowBox = 850;
+    if (kind == SampleKind::Text && !HasSampleWords(name) && control.Integer("Width", 0) < kNarrowBox)
+        return std::to_string(row % 4 + 1);
     return SampleText(kind, format, name, row);
 }
 
@@ -199,11 +229,17 @@ std::string SampleData::Expression(const DesignObject& control, std::string_view
         if (text::ContainsIgnoringCase(expression, sum))
             return SampleText(SampleKind::Number, control.Text("Format"), "", row);
     const auto format = control.Text("Format");
-    return SampleText(KindOf(format, control.name), format, control.name, row);
+    const auto field = LookedUpField(expression);
+    if (!field.empty() && KindOf(format, field) == SampleKind::Text && !HasSampleWords(field))
+        return Spaced(field);
+    const auto& name = field.empty() ? control.name : field;
+    return SampleText(KindOf(format, name), format, name, row);
 }
 
 std::string SampleData::Text(const DesignObject& control, int row) const {
     const auto source = control.Text("ControlSource");
+    if (source == "=1" && control.Integer("RunningSum", 0) != 0)
+        return std::to_string(row + 1);
     if (source.empty()) {
         const auto standard = control.Text("DefaultValue");
         if (standard.find('(') != std::string::npos || standard.find('[') != std::string::npos)

@@ -147,6 +147,10 @@ SampleKind KindOf(std::string_view format, std::string_view fieldName) {
     return LooksLikeNumber(fieldName) ? SampleKind::Number : SampleKind::Text;
 }
 
+bool HasSampleWords(std::string_view fieldName) {
+    return FindHint(fieldName) != nullptr;
+}
+
 std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row) {
     const auto at = static_cast<std::size_t>(row < 0 ? 0 : row) % kPlainWords.size();
     const auto* hint = FindHint(fieldName);

@@ -11,6 +11,9 @@ enum class SampleKind { Text, Number, Money, Date, Boolean };
 /// What a field is by its display format and its name.
 SampleKind KindOf(std::string_view format, std::string_view fieldName);
 
+/// Is there sample text that fits a field of that name?
+bool HasSampleWords(std::string_view fieldName);
+
 /// Content of a field in the row `row` (from 0).
 std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row);
 

@@ -193,6 +193,46 @@ int LeftOf(const TextPlace& place, int width) {
 
 } // namespace
 
+namespace {
+
+/// Labels were made to fit their text in the family that the substitute stands for. So text that is a little
+/// too broad, or that would take a line too many, is drawn narrower by up to this factor.
+constexpr double kNarrowest = 0.85;
+
+struct Fitted {
+    int width = 0, height = 0; ///< as laid out
+    double scale = 1;          ///< horizontally
+};
+
+Fitted Fit(PangoLayout* layout, const TextPlace& place) {
+    Fitted fitted;
+    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
+    const int room = place.area.Width();
+    if (!place.wrap) {
+        // Each scale has glyphs of its own to be drawn: few steps keep them shared.
+        for (const double scale : {0.95, 0.9, kNarrowest})
+            if (fitted.width > room && fitted.width * scale <= room) {
+                fitted.scale = scale;
+                break;
+            }
+        return fitted;
+    }
+    if (fitted.height <= place.area.Height() + 1)
+        return fitted;
+    const int height = fitted.height;
+    pango_layout_set_width(layout, static_cast<int>(room / kNarrowest) * PANGO_SCALE);
+    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
+    if (fitted.height < height) {
+        fitted.scale = kNarrowest;
+        return fitted;
+    }
+    pango_layout_set_width(layout, room * PANGO_SCALE);
+    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
+    return fitted;
+}
+
+} // namespace
+
 void DrawText(Canvas& canvas, std::string_view text, const TextStyle& style, const TextPlace& place) {
     if (text.empty() || !canvas.Visible(place.area))
         return;
@@ -205,13 +245,12 @@ void DrawText(Canvas& canvas, std::string_view text, const TextStyle& style, con
     pango_layout_set_alignment(layout, place.wrap ? Alignment(place.align) : PANGO_ALIGN_LEFT);
     Underline(layout, style, caption);
 
-    int width = 0, height = 0;
-    if (place.align != Align::Left || place.vertical != VerticalAlign::Top)
-        pango_layout_get_pixel_size(layout, &width, &height);
-    const int left = place.wrap ? place.area.left : LeftOf(place, width);
+    const auto fitted = Fit(layout, place);
+    const int shown = static_cast<int>(fitted.width * fitted.scale + 0.5);
+    const int left = place.wrap ? place.area.left : LeftOf(place, shown);
     const int top = place.vertical == VerticalAlign::Top
                         ? place.area.top
-                        : place.area.top + std::max(0, (place.area.Height() - height) / 2);
+                        : place.area.top + std::max(0, (place.area.Height() - fitted.height) / 2);
     {
         const ClipTo clip(canvas, place.area);
         auto* context = canvas.Context();
@@ -219,8 +258,12 @@ void DrawText(Canvas& canvas, std::string_view text, const TextStyle& style, con
             return static_cast<double>((style.color >> shift) & 0xFFU) / 255.0;
         };
         cairo_set_source_rgb(context, part(16), part(8), part(0));
-        cairo_move_to(context, left, top);
+        cairo_save(context);
+        cairo_translate(context, left, top);
+        cairo_scale(context, fitted.scale, 1);
+        cairo_move_to(context, 0, 0);
         pango_cairo_show_layout(context, layout);
+        cairo_restore(context);
     }
     pango_layout_set_attributes(layout, nullptr);
 }
