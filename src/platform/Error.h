@@ -10,7 +10,9 @@ namespace tovimar {
 /// Failures with a text of their own start at 0x80040001.
 using ResultCode = std::int32_t;
 
-constexpr ResultCode MakeResultCode(std::uint32_t bits) { return static_cast<ResultCode>(bits); }
+constexpr ResultCode MakeResultCode(std::uint32_t bits) {
+    return static_cast<ResultCode>(bits);
+}
 
 constexpr ResultCode kSuccess = 0;
 /// General failure of an operation, or a run that was stopped.
