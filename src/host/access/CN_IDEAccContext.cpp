@@ -11,6 +11,7 @@
 #include "host/contract/ObjectTypes.h"
 #include "host/server/CXmlCommand.h"
 #include "platform/Environment.h"
+#include "platform/files/Paths.h"
 #include "uimodel/CClientUIObjectRawXml.h"
 
 namespace tovimar {
@@ -21,15 +22,6 @@ constexpr ResultCode kObjectClosed = 2467;
 constexpr std::int32_t kMeterStart = 1;
 constexpr std::int32_t kMeterMove = 2;
 constexpr std::int32_t kMeterRemove = 3;
-
-std::string WithoutExtension(const std::string& fileName) {
-    const auto point = fileName.rfind('.');
-    return point == std::string::npos ? fileName : fileName.substr(0, point);
-}
-
-std::string FileNameOf(const std::string& path) {
-    return path.substr(path.find_last_of("\\/") + 1);
-}
 
 } // namespace
 
@@ -90,7 +82,7 @@ void CN_IDEAccContext::SetCurrentSourceProject(const std::string& vstrProjectNam
 
 // The host has one project at a time.
 std::string CN_IDEAccContext::SourceProjectsList() {
-    return WithoutExtension(FileNameOf(access_project::FullName(application_)));
+    return platform::BaseNameOf(access_project::FullName(application_));
 }
 
 bool CN_IDEAccContext::AreThereAnySourceProjectsOpened() {
@@ -102,7 +94,7 @@ std::string CN_IDEAccContext::CurrentSourceProjectFullPath() {
 }
 
 std::string CN_IDEAccContext::CurrentSourceProjectName() {
-    return WithoutExtension(late::TextOrEmpty(CurrentProject(), "Name"));
+    return platform::BaseNameOf(late::TextOrEmpty(CurrentProject(), "Name"));
 }
 
 std::string CN_IDEAccContext::CurrentSourceProjectTypeName() {
@@ -110,10 +102,7 @@ std::string CN_IDEAccContext::CurrentSourceProjectTypeName() {
 }
 
 std::string CN_IDEAccContext::CurrentSourceProjectLocation() {
-    std::string folder = late::TextOrEmpty(CurrentProject(), "Path");
-    if (!folder.empty() && folder.back() != '\\')
-        folder += '\\';
-    return folder;
+    return platform::WithTrailingBackslash(late::TextOrEmpty(CurrentProject(), "Path"));
 }
 
 bool CN_IDEAccContext::CurrentSourceProjectIsDirty() {

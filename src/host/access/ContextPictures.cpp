@@ -9,6 +9,7 @@
 #include "host/access/LateBound.h"
 #include "host/contract/ObjectTypes.h"
 #include "platform/Environment.h"
+#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 #include "platform/windowing/WindowSystem.h"
 #include "screenshots/CFormBitmapCapture.h"
@@ -22,16 +23,6 @@ constexpr const char* kClass = "CN_IDEAccContext";
 constexpr ResultCode kNotAvailableNow = 2046;
 constexpr std::int32_t kOpenRelationships = 133;
 constexpr const char* kRelationshipsClass = "OSysRel";
-
-std::string FolderOf(const std::string& path) {
-    return path.substr(0, path.find_last_of('\\') + 1);
-}
-
-/// File name without its folder and extension.
-std::string BaseNameOf(const std::string& path) {
-    const std::string file = path.substr(path.find_last_of('\\') + 1);
-    return file.substr(0, file.rfind('.'));
-}
 
 void ReportDatamodelFailure(const RaisedError& failure) {
     if (failure.Number() == kNotAvailableNow)
@@ -87,7 +78,9 @@ void CN_IDEAccContext::TakeScreenshot(std::int32_t type, const std::string& name
     const HostObject open = late::Object(application_, isReport ? "Reports" : "Forms", {name});
     const bool designView = !isReport && late::Integer(open, "currentview") == 0;
     const std::string picture =
-        picPath.empty() ? picPath : FolderOf(picPath) + BaseNameOf(picPath) + parameters.ImagesFileExt();
+        picPath.empty()
+            ? picPath
+            : platform::FolderOf(picPath) + platform::BaseNameOf(picPath) + parameters.ImagesFileExt();
 
     const std::unique_ptr<CXmlForm> form = generator.CreateNormalizedXmlDef(
         type, name, HostAppMainWindowHWnd(), designView, /*vfReplaceHtml=*/false, parameters.ImagesFormat,
@@ -102,7 +95,7 @@ void CN_IDEAccContext::TakeScreenshot(std::int32_t type, const std::string& name
         form->Charset = parameters.Charset;
     if (!htmlPath.empty())
         form->SaveHTMLEx(htmlPath, isReport, /*vfApplyZoomFactor=*/false, /*vfUseLocalImagePath=*/true,
-                         FolderOf(picture));
+                         platform::FolderOf(picture));
 }
 
 } // namespace tovimar

@@ -29,10 +29,13 @@ HostObject CodeModuleOf(const HostObject& app, const HostObject& form) {
     return late::Object(component, "CodeModule");
 }
 
-/// The language's identifiers hold letters, digits and "_" only.
-std::string ProcedureName(const std::string& controlName) {
-    std::string name;
-    for (const char character : controlName) {
+/// The host keeps the start of the procedures' names where it isn't the control's name. Otherwise every
+/// sign that the language's identifiers can't hold, such as a blank, becomes "_".
+std::string ProcedureName(const HostObject& control) {
+    std::string name = late::TextOrEmpty(control, "EventProcPrefix");
+    if (!name.empty())
+        return name + "_Click";
+    for (const char character : late::Text(control, "Name")) {
         const bool asciiSign = static_cast<unsigned char>(character) < 128 && character != '_' &&
                                !(character >= '0' && character <= '9') &&
                                !(character >= 'A' && character <= 'Z') &&
@@ -116,7 +119,7 @@ std::string CN_IDEAccFormProcessor::GetOnClickActionDescription(const HostObject
         if (!module || event.front() == '=')
             return;
         if (text::EqualsIgnoringCase(event, "[Event procedure]"))
-            description = DescriptionOfCode(ProcedureLines(module, ProcedureName(late::Text(rctl, "Name"))));
+            description = DescriptionOfCode(ProcedureLines(module, ProcedureName(rctl)));
         else
             description =
                 Session::Messages()->GetMessageWithParams("DoCmd.Run acMacro", {ReferenceTo(event, "macro")});

@@ -16,6 +16,7 @@
 #include "generation/RunProgress.h"
 #include "host/server/CTovimarServerAgent.h"
 #include "platform/Environment.h"
+#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
@@ -118,9 +119,7 @@ std::int32_t CTovimarServerData::HostAppMainWindowHWnd() {
 }
 
 std::string CTovimarServerData::NewTovimarProjectName() {
-    const std::string path = CurrentSourceProjectFullPath();
-    const std::string file = path.substr(path.find_last_of("\\/") + 1);
-    const std::string name = NormalizeName(file.substr(0, file.rfind('.')));
+    const std::string name = NormalizeName(platform::BaseNameOf(CurrentSourceProjectFullPath()));
     const CAddInProject* project = Session::CurrentProject();
     return name.empty() && project != nullptr ? project->Name : name;
 }

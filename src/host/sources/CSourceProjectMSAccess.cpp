@@ -12,6 +12,7 @@
 #include "host/sources/DesignTextCopy.h"
 #include "platform/Environment.h"
 #include "platform/access/ExportReader.h"
+#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
 #include <cstdio>
@@ -22,11 +23,6 @@ namespace tovimar {
 namespace {
 
 constexpr const char* kClass = "CSourceProjectMSAccess";
-
-std::string BaseNameOf(const std::string& path) {
-    const std::string file = path.substr(path.find_last_of("\\/") + 1);
-    return file.substr(0, file.rfind('.'));
-}
 
 /// Time of day and a fresh identifier: two programs may read at the same moment.
 std::string MakeStamp() {
@@ -89,7 +85,7 @@ ResultCode CSourceProjectMSAccess::Init(const std::string& vstrSourceProjectType
     CTovimarServerAgent* agent = Session::ServerAgent();
     if (agent == nullptr || Session::Parameters() == nullptr)
         return kFailure1;
-    name_ = BaseNameOf(vstrProjectFileFullPath);
+    name_ = platform::BaseNameOf(vstrProjectFileFullPath);
     const ResultCode failure = Trapped(kClass, "IHelpPrjSourceProject_Init", [&] { Read(*agent); });
     agent->ProgressMeterRemove();
     agent->HourglassOff();

@@ -1,0 +1,59 @@
+#include "foundation/Session.h"
+#include "host/contract/IHelpPrjSourceProject.h"
+#include "host/contract/ObjectTypes.h"
+#include "host/server/CTovimarClient.h"
+#include "host/server/CTovimarServer.h"
+#include "host/server/CTovimarServerAgent.h"
+#include "host/server/CXmlCommand.h"
+#include "host/sources/CHelpPrjSourceItem.h"
+#include "platform/access/AccessApplication.h"
+#include "platform/xml/XmlDocument.h"
+#include "support/FakeEnvironment.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+
+namespace tovimar {
+namespace {
+
+/// Every object of a real application is read through the commands, as a run does.
+class CorpusTest : public test::EnvironmentTest, public ::testing::WithParamInterface<const char*> {};
+
+std::string Describe(std::int32_t type, const std::string& name) {
+    const std::string answer =
+        TheServer().SendCommand(CXmlCommand()
+                                    .Build("ProcessComponent", {{"ObjectType", type},
+                                                                {"ComponentName", name},
+                                                                {"HostAppIDEHwnd", 0},
+                                                                {"CaptureRptPreviewAreaOnly", false},
+                                                                {"SourceProjectTypeName", "MS ACCESS"},
+                                                                {"KeepSourceObjectOpened", false}})
+                                    .Serialize());
+    return CXmlCommand().Deserialize(answer).Text;
+}
+
+TEST_P(CorpusTest, EveryObjectIsDescribed) {
+    const std::string folder = std::string(TOVIMAR_SOURCE_DIR "/../shared/corpus/") + GetParam();
+    if (!std::filesystem::exists(folder))
+        GTEST_SKIP() << "the corpus is absent: " << folder;
+    CTovimarClient client;
+    ASSERT_EQ(client.Connect(platform::access::OpenAccessApplication(folder)), kSuccess);
+    const auto project = Session::ServerAgent()->ParseSourceProject();
+    ASSERT_NE(project, nullptr);
+    for (const SourceItems* items : {&project->Forms(), &project->Reports(), &project->Tables(),
+                                     &project->Queries(), &project->Macros()})
+        for (const auto& item : *items) {
+            XmlDocument document;
+            EXPECT_TRUE(document.loadXML(Describe(item->ObjType(), item->FormName)))
+                << item->SubType << " " << item->FormName;
+        }
+    EXPECT_FALSE(project->Forms().Empty());
+    for (const auto& box : boxes->shown)
+        std::printf("box: %.300s\n", box.text.c_str());
+}
+
+INSTANTIATE_TEST_SUITE_P(Applications, CorpusTest, ::testing::Values("vcs-testing", "sports-admin"));
+
+} // namespace
+} // namespace tovimar
