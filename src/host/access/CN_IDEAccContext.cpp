@@ -194,8 +194,13 @@ void CN_IDEAccContext::myDoevents() {
     platform::Env().doEvents();
 }
 
+// Whoever asked sees that no file came. That a design can't be read is told once, when it is to be opened.
 void CN_IDEAccContext::SaveAsText(std::int32_t type, const std::string& name, const std::string& path) {
-    late::Call(application_, "SaveAsText", {type, name, path});
+    try {
+        late::Call(application_, "SaveAsText", {type, name, path});
+    } catch (const RaisedError& failure) {
+        TraceText([&] { return "SaveAsText [" + name + "]: " + failure.what(); });
+    }
 }
 
 bool CN_IDEAccContext::ComponentExists(std::int32_t vlngCompType, const std::string& vstrCompName) {

@@ -78,6 +78,7 @@ public:
 
     /// Name of the active form, else of the active report, else empty.
     std::string ActiveObjectName();
+    /// A failure leaves no file and is only traced.
     void SaveAsText(std::int32_t type, const std::string& name, const std::string& path);
     /// The fields of a query by where they come from, as XML for the query's topic.
     std::string GetQueryXmlDescription(const HostObject& rapp, const std::string& vstrQueryName);
@@ -96,7 +97,6 @@ private:
     HostObject CatalogueEntry(std::int32_t type, const std::string& name);
     HostObject OpenObjectByName(std::int32_t type, const std::string& name);
     HostObject FindActual(std::int32_t type, const std::string& name, bool hidden, bool designView);
-    void RunCommand(CXmlCommand& command);
     void SysCmd(std::int32_t action, const AutomationObject::Arguments& arguments = {});
 
     HostObject application_;

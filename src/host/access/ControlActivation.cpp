@@ -29,8 +29,6 @@ HostObject ControlOf(const HostObject& form, const std::string& name) {
     return late::Object(form, "Controls", {name});
 }
 
-} // namespace
-
 /// Goes through the pairs of a path, type and name each, with the form that they are sought on.
 class ControlPathWalk {
 public:
@@ -80,6 +78,8 @@ private:
     bool runtime_;
     bool setFocus_;
 };
+
+} // namespace
 
 bool CN_IDEAccContext::ActivateControl(const std::string& vstrControlFullPath, bool vfRuntime,
                                        bool vfSetFocus) {
