@@ -74,7 +74,34 @@ void TakeFields(const Records& records, TableDefinition& table) {
     }
 }
 
+/// Reads a definition at the first question; a failure is kept and raised at every one.
+template <typename Part, typename Read> void LoadOnce(Part& part, const Read& read) {
+    if (!part.loaded) {
+        part.loaded = true;
+        try {
+            read();
+        } catch (const RaisedError& failure) {
+            part.error = failure.what();
+        }
+    }
+    if (!part.error.empty())
+        throw RaisedError(kFailure1, part.error, "AccessApplication");
+}
+
 } // namespace
+
+/// Tables and queries for resolving fields; one that can't be read counts as unknown there.
+FieldSources ApplicationModel::Sources() {
+    const auto find = [](const auto& look) -> decltype(look()) {
+        try {
+            return look();
+        } catch (const RaisedError&) {
+            return nullptr;
+        }
+    };
+    return {[this, find](const std::string& name) { return find([&] { return FindTable(name); }); },
+            [this, find](const std::string& name) { return find([&] { return FindQuery(name); }); }};
+}
 
 ApplicationModel::Table& ApplicationModel::TableNamed(const std::string& name) {
     if (auto* known = tables_.Find(name))
@@ -86,9 +113,10 @@ ApplicationModel::Table& ApplicationModel::TableNamed(const std::string& name) {
 }
 
 void ApplicationModel::LoadTable(Table& table) {
-    if (table.loaded)
-        return;
-    table.loaded = true;
+    LoadOnce(table, [&] { ReadTable(table); });
+}
+
+void ApplicationModel::ReadTable(Table& table) {
     const auto name = table.definition.name;
     auto& definition = table.definition;
     if (!table.sqlPath.empty())
@@ -104,15 +132,19 @@ void ApplicationModel::LoadTable(Table& table) {
 }
 
 void ApplicationModel::LoadQuery(Query& query) {
-    if (query.loaded)
-        return;
-    query.loaded = true;
+    LoadOnce(query, [&] { ReadQuery(query); });
+}
+
+void ApplicationModel::ReadQuery(Query& query) {
     const auto name = query.definition.name;
     const auto source = ReadText(query.path);
     const bool isExport = RecognizeExport(source) == ExportContent::Query;
     query.definition =
         isExport ? ReadQueryExport(source, Env().files->ToNative(query.path)) : ParseQuerySql(source);
     query.definition.name = name;
+    if (!query.infoPath.empty())
+        for (auto& property : ReadQueryInfo(ReadText(query.infoPath), Env().files->ToNative(query.infoPath)))
+            query.definition.properties.push_back(std::move(property));
 }
 
 const TableDefinition* ApplicationModel::FindTable(const std::string& name) {
@@ -139,9 +171,7 @@ const std::vector<FieldDefinition>& ApplicationModel::QueryFields(const std::str
     auto& query = **found;
     LoadQuery(query);
     if (!query.resolved) {
-        const FieldSources sources{[this](const std::string& table) { return FindTable(table); },
-                                   [this](const std::string& other) { return FindQuery(other); }};
-        query.fields = ResolveQueryFields(query.definition, sources);
+        query.fields = ResolveQueryFields(query.definition, Sources());
         query.resolved = true;
     }
     return query.fields;
@@ -175,10 +205,8 @@ Records ApplicationModel::ReadRecords(const std::string& source, int rows, int d
         return QueryRecords(*query, QueryFields(source), rows, depth);
     if (!IsStatement(source))
         return {};
-    const FieldSources sources{[this](const std::string& table) { return FindTable(table); },
-                               [this](const std::string& other) { return FindQuery(other); }};
     const auto query = ParseQuerySql(source);
-    return QueryRecords(query, ResolveQueryFields(query, sources), rows, depth);
+    return QueryRecords(query, ResolveQueryFields(query, Sources()), rows, depth);
 }
 
 Records ApplicationModel::TableRecords(Table& table, int rows) {

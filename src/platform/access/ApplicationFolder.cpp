@@ -62,6 +62,11 @@ FolderHint HintOf(const std::string& folderName) {
     return found == kHints.end() ? FolderHint::None : found->second;
 }
 
+/// A name that begins with the text of two points is an object's, with its backslashes encoded.
+bool IsHidden(const std::string& name) {
+    return name.starts_with('.') && !name.starts_with("..");
+}
+
 bool IsObject(PartKind kind) {
     return kind <= PartKind::Table || kind == PartKind::LinkedTable;
 }
@@ -85,6 +90,10 @@ std::optional<PartKind> KindOfJson(const std::string& start, FolderHint hint) {
     const auto has = [&](std::string_view word) { return start.find(word) != std::string::npos; };
     if (has("\"clsDbTableDef\""))
         return PartKind::LinkedTable;
+    if (has("\"clsDbDocument\""))
+        return PartKind::Documents;
+    if (has("\"clsDbQuery\"") || hint == FolderHint::Queries)
+        return PartKind::QueryInfo;
     if (has("\"clsDbRelation\"") || hint == FolderHint::Relations)
         return PartKind::Relation;
     if (has("\"clsDbSharedImage\"") || hint == FolderHint::Images)
@@ -199,10 +208,10 @@ private:
         auto& files = *Env().files;
         const auto hint = HintOf(FileNameOf(path));
         for (const auto& name : files.ListFiles(path, "*.*"))
-            if (!name.starts_with('.') && ++seen_ <= kMaxFiles)
+            if (!IsHidden(name) && ++seen_ <= kMaxFiles)
                 TakeFile(path + "\\" + name, hint, depth);
         for (const auto& name : files.ListFolders(path))
-            if (!name.starts_with('.') && next.size() < kMaxFiles)
+            if (!IsHidden(name) && next.size() < kMaxFiles)
                 next.push_back(path + "\\" + name);
     }
 

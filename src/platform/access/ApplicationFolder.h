@@ -18,6 +18,8 @@ enum class PartKind {
     Code,            ///< module of a form or report in a file of its own beside it
     TableProperties, ///< schema beside a table's statement
     LinkedTable,
+    QueryInfo, ///< properties beside a query's statement
+    Documents, ///< properties of all forms, reports, macros and modules in one file
     Relation,
     TableData,
     Picture,

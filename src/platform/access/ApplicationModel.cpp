@@ -104,6 +104,13 @@ void ApplicationModel::OpenFolder(const std::string& path) {
         fullName_ = path + "\\" + FileNameOf(path) + ".accdb";
     for (const auto& part : folder.parts)
         TakePart(part);
+    for (const auto& code : codePaths_)
+        TakeCode(code);
+    for (const auto& [name, info] : queryInfos_)
+        if (auto* query = queries_.Find(name))
+            (*query)->infoPath = info;
+    if (!documentsPath_.empty())
+        TakeDocuments(documentsPath_);
     const bool exports =
         std::any_of(std::begin(kindInExports_), std::end(kindInExports_), [](bool any) { return any; });
     for (std::size_t i = 0; i < folder.databases.size(); ++i) {
@@ -117,62 +124,93 @@ void ApplicationModel::OpenFolder(const std::string& path) {
     }
 }
 
+void ApplicationModel::TakeObject(ObjectKind kind, const ApplicationPart& part) {
+    kindInExports_[IndexOf(kind)] = true;
+    auto& objects = ListOf(kind);
+    if (objects.Contains(part.name))
+        return;
+    auto object = std::make_unique<Object>();
+    object->name = part.name;
+    object->path = part.path;
+    objects.Add(std::move(object), part.name);
+}
+
+void ApplicationModel::TakeQuery(const ApplicationPart& part) {
+    kindInExports_[IndexOf(ObjectKind::Query)] = true;
+    if (queries_.Contains(part.name))
+        return;
+    auto query = std::make_unique<Query>();
+    query->path = part.path;
+    query->definition.name = part.name;
+    queries_.Add(std::move(query), part.name);
+}
+
+void ApplicationModel::TakeCode(const std::string& path) {
+    for (auto* objects : {&forms_, &reports_}) {
+        auto* object = objects->Find(DecodeObjectName(BaseNameOf(path)));
+        if (object && text::EqualsIgnoringCase(FolderOf((*object)->path), FolderOf(path)))
+            (*object)->codePath = path;
+    }
+}
+
 void ApplicationModel::TakePart(const ApplicationPart& part) {
-    const auto kind = KindOfPart(part.kind);
     switch (part.kind) {
     case PartKind::Form:
     case PartKind::Report:
     case PartKind::Macro:
-    case PartKind::Module: {
-        kindInExports_[IndexOf(kind)] = true;
-        auto& objects = ListOf(kind);
-        if (!objects.Contains(part.name)) {
-            objects.Add(std::make_unique<Object>(), part.name);
-            auto& object = **objects.Find(part.name);
-            object.name = part.name;
-            object.path = part.path;
-        }
-        break;
-    }
+    case PartKind::Module:
+        return TakeObject(KindOfPart(part.kind), part);
     case PartKind::Query:
-        kindInExports_[IndexOf(ObjectKind::Query)] = true;
-        if (!queries_.Contains(part.name)) {
-            queries_.Add(std::make_unique<Query>(), part.name);
-            (*queries_.Find(part.name))->path = part.path;
-            (*queries_.Find(part.name))->definition.name = part.name;
-        }
-        break;
+        return TakeQuery(part);
     case PartKind::Code:
-        for (auto* objects : {&forms_, &reports_})
-            for (auto& object : *objects)
-                if (text::EqualsIgnoringCase(FolderOf(object->path) + BaseNameOf(object->path),
-                                             FolderOf(part.path) + BaseNameOf(part.path)))
-                    object->codePath = part.path;
-        break;
+        codePaths_.push_back(part.path);
+        return;
+    case PartKind::Relation:
+        return TakeRelation(part.path);
     case PartKind::Table:
         TableNamed(part.name).sqlPath = part.path;
-        break;
+        return;
     case PartKind::TableProperties:
         TableNamed(part.name).schemaPath = part.path;
-        break;
+        return;
     case PartKind::LinkedTable:
         TableNamed(part.name).linkPath = part.path;
-        break;
+        return;
     case PartKind::TableData:
         TableNamed(part.name).dataPath = part.path;
-        break;
-    case PartKind::Relation:
-        TakeRelation(part.path);
-        break;
+        return;
+    case PartKind::QueryInfo:
+        queryInfos_.emplace_back(part.name, part.path);
+        return;
+    case PartKind::Documents:
+        documentsPath_ = part.path;
+        return;
+    case PartKind::ProjectInfo:
+        projectInfoPath_ = part.path;
+        return;
     case PartKind::Picture:
         if (!pictures_.Contains(part.name))
             pictures_.Add(part.path, part.name);
-        break;
+        return;
     case PartKind::PictureInfo:
-        break;
-    case PartKind::ProjectInfo:
-        projectInfoPath_ = part.path;
-        break;
+        return;
+    }
+}
+
+/// Descriptions that stand in files of their own; without them the application is the same.
+void ApplicationModel::TakeDocuments(const std::string& path) {
+    static const std::pair<const char*, ObjectKind> kContainers[] = {{"Forms", ObjectKind::Form},
+                                                                     {"Reports", ObjectKind::Report},
+                                                                     {"Scripts", ObjectKind::Macro},
+                                                                     {"Modules", ObjectKind::Module}};
+    try {
+        for (auto& document : ReadDocuments(ReadText(path), Native(path)))
+            for (const auto& [container, kind] : kContainers)
+                if (document.container == container)
+                    if (auto* object = ListOf(kind).Find(document.name))
+                        (*object)->properties = std::move(document.properties);
+    } catch (const RaisedError&) {
+        return;
     }
 }
 

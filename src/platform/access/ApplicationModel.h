@@ -5,6 +5,7 @@
 #include "platform/access/ApplicationFolder.h"
 #include "platform/access/DatabaseReader.h"
 #include "platform/access/OpenObject.h"
+#include "platform/access/QueryReader.h"
 
 #include <memory>
 #include <string>
@@ -75,13 +76,15 @@ private:
     struct Table {
         TableDefinition definition;
         bool loaded = false;
+        std::string error; ///< why the definition can't be read
         std::string sqlPath, schemaPath, linkPath, dataPath;
         std::string database;
     };
     struct Query {
         QueryDefinition definition;
         bool loaded = false;
-        std::string path;
+        std::string error; ///< why the definition can't be read
+        std::string path, infoPath;
         std::vector<FieldDefinition> fields;
         bool resolved = false;
     };
@@ -90,7 +93,11 @@ private:
     void OpenDatabaseFile(const std::string& path);
     void OpenFolder(const std::string& path);
     void TakePart(const ApplicationPart& part);
+    void TakeObject(ObjectKind kind, const ApplicationPart& part);
+    void TakeQuery(const ApplicationPart& part);
+    void TakeCode(const std::string& path);
     void TakeRelation(const std::string& path);
+    void TakeDocuments(const std::string& path);
     void TakeDatabase(const std::string& path, bool topLevel);
     void TakeDatabaseTables(DatabaseContent& content, const std::string& nativePath);
     void SortNames();
@@ -100,7 +107,10 @@ private:
     void Load(ObjectKind kind, Object& object);
     Table& TableNamed(const std::string& name);
     void LoadTable(Table& table);
+    void ReadTable(Table& table);
     void LoadQuery(Query& query);
+    void ReadQuery(Query& query);
+    FieldSources Sources();
     Records ReadRecords(const std::string& recordSource, int rows, int depth);
     Records TableRecords(Table& table, int rows);
     Records QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields, int rows,
@@ -109,6 +119,9 @@ private:
     std::string fullName_;
     std::string folder_;
     std::string projectInfoPath_;
+    std::string documentsPath_;
+    std::vector<std::string> codePaths_;
+    std::vector<std::pair<std::string, std::string>> queryInfos_; ///< name, path
     Objects forms_, reports_, macros_, modules_;
     KeyedList<std::unique_ptr<Table>> tables_;
     KeyedList<std::unique_ptr<Query>> queries_;

@@ -12,10 +12,24 @@ bool HasDesign(ObjectKind kind) {
     return kind == ObjectKind::Form || kind == ObjectKind::Report || kind == ObjectKind::Macro;
 }
 
+std::string DefinitionError(ApplicationModel& model, ObjectKind kind, const std::string& name) {
+    try {
+        if (kind == ObjectKind::Table)
+            model.FindTable(name);
+        else if (kind == ObjectKind::Query)
+            model.FindQuery(name);
+        return {};
+    } catch (const RaisedError& failure) {
+        return failure.what();
+    }
+}
+
 ObjectSummary Summarize(ApplicationModel& model, ObjectKind kind, const std::string& name) {
     ObjectSummary summary{kind, name, {}, true, {}};
-    if (!HasDesign(kind))
+    if (!HasDesign(kind)) {
+        summary.error = DefinitionError(model, kind, name);
         return summary;
+    }
     summary.designKnown = model.DesignKnown(kind, name);
     const auto* design = model.FindDesign(kind, name);
     if (design && kind != ObjectKind::Macro)
@@ -34,7 +48,9 @@ void AddNote(const std::vector<ObjectSummary>& objects, ObjectKind kind, const c
         damaged += object.kind == kind && !object.error.empty() ? 1 : 0;
     }
     const auto noun = [&](std::size_t count) {
-        return std::to_string(count) + " " + word + (count == 1 ? "" : "s");
+        const std::string singular = word;
+        const auto plural = singular == "query" ? std::string("queries") : singular + "s";
+        return std::to_string(count) + " " + (count == 1 ? singular : plural);
     };
     if (unknown > 0)
         notes.push_back(noun(unknown) + " known by name only.");
@@ -58,6 +74,8 @@ ApplicationSummary SummarizeApplication(const std::string& nativePath) {
         for (const auto& name : model.Names(kind))
             if (!IsSystemTable(kind, name))
                 summary.objects.push_back(Summarize(model, kind, name));
+    AddNote(summary.objects, ObjectKind::Table, "table", summary.notes);
+    AddNote(summary.objects, ObjectKind::Query, "query", summary.notes);
     AddNote(summary.objects, ObjectKind::Form, "form", summary.notes);
     AddNote(summary.objects, ObjectKind::Report, "report", summary.notes);
     AddNote(summary.objects, ObjectKind::Macro, "macro", summary.notes);

@@ -112,6 +112,33 @@ TableDefinition ReadLinkedTable(std::string_view source, const std::string& name
     return table;
 }
 
+NamedTexts ReadQueryInfo(std::string_view source, const std::string& nativePath) {
+    const auto json = Parse(source, nativePath);
+    const auto& items = At(json, "Items");
+    NamedTexts properties;
+    if (const auto description = Text(At(items, "Description")); !description.empty())
+        properties.emplace_back("Description", description);
+    ReadProperties(At(items, "Properties"), properties);
+    return properties;
+}
+
+std::vector<DocumentInfo> ReadDocuments(std::string_view source, const std::string& nativePath) {
+    std::vector<DocumentInfo> documents;
+    const auto json = Parse(source, nativePath);
+    const auto& containers = At(json, "Items");
+    if (!containers.is_object())
+        return documents;
+    for (const auto& [container, objects] : containers.items()) {
+        if (!objects.is_object())
+            continue;
+        for (const auto& [name, properties] : objects.items()) {
+            documents.push_back({container, name, {}});
+            ReadProperties(properties, documents.back().properties);
+        }
+    }
+    return documents;
+}
+
 RelationDefinition ReadRelation(std::string_view source, const std::string& nativePath) {
     return source.starts_with('{') ? ReadJsonRelation(source, nativePath) : ReadLinedRelation(source);
 }

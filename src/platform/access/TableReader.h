@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 /// Tables, relations and data from the text files of an export folder. What a text doesn't hold stays
 /// empty; a JSON or XML text that can't be read raises 0x80040001 "<file>: <reason>".
@@ -21,6 +22,16 @@ void MergeTableSchema(std::string_view xml, const std::string& nativePath, Table
 /// A linked table's JSON text: connection, source and properties.
 TableDefinition ReadLinkedTable(std::string_view json, const std::string& name,
                                 const std::string& nativePath);
+
+/// Properties of the query in the JSON text beside its statement, its description among them.
+NamedTexts ReadQueryInfo(std::string_view json, const std::string& nativePath);
+
+/// Properties of named objects: container ("Forms", "Scripts", ...), object, properties.
+struct DocumentInfo {
+    std::string container, name;
+    NamedTexts properties;
+};
+std::vector<DocumentInfo> ReadDocuments(std::string_view json, const std::string& nativePath);
 
 /// A relation as JSON, or as lines: attributes, name, table, foreign table, and per field
 /// "Field = Begin", name, foreign name, "End".

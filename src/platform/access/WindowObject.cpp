@@ -89,10 +89,12 @@ void WindowObject::Build() {
         "Controls", 0,
         MissingEntry{kNoSuchControl,
                      "The application can't find the field '|' referred to in your expression."});
-    for (const auto& section : open_.design->Sections()) {
+    for (const auto& section : open_.design->Sections())
         sections_[section.object] = section.number;
-        AddControls(*section.object, section.number);
-    }
+    // In the order of the source, which goes down the form.
+    for (const auto& child : open_.design->root->children)
+        if (const auto section = sections_.find(child.get()); section != sections_.end())
+            AddControls(*child, section->second);
 }
 
 /// All controls at every depth in one list. Fillers of a control layout are no controls to a user.
