@@ -224,8 +224,9 @@ std::string CHelpPrjTree::ProjectFileText(bool skipSerializers, const std::strin
         text += settings->XMLSTr(
             {"LastUsedFolderForGeneratedHelp", "LastUsedFolderForCapturedImages", "DefaultHtmlFullPath"},
             &fixedValues);
+        text += kCrLf;
     }
-    text += std::string(kCrLf) + "</TovimarProject>";
+    text += "</TovimarProject>";
     return text::ReplaceAll(text, "\r\n\r\n", kCrLf);
 }
 

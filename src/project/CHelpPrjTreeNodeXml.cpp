@@ -61,7 +61,7 @@ private:
 };
 
 void EndLine(std::string& out) {
-    if (!text::EndsWithIgnoringCase(out, kCrLf))
+    if (!out.ends_with(kCrLf))
         out += kCrLf;
 }
 

@@ -56,10 +56,20 @@ public:
 
 private:
     struct Element;
+    /// What an entry takes over from the one above it.
+    struct Surroundings {
+        std::string icon;
+        bool hidden = false;
+        std::string type;
+        std::int32_t version = 1;
+    };
 
     std::string Parameter(const std::string& name) const;
     std::string CommentValue(const std::string& name) const;
     void ReadComment();
+    void AppendXml(std::string& out, std::int32_t& pref, const Surroundings& around) const;
+    void AppendSitemap(std::string& out) const;
+    std::string ObjectTag(const std::string& tag, const std::string& type) const;
     Element DescribeElement(std::int32_t pref, const std::string& type) const;
     std::string OpenTag(const Element& element, const std::string& type, bool hidden, bool underIcon) const;
 
