@@ -1,7 +1,6 @@
 #include "platform/imaging/Jpeg.h"
 
 #include <algorithm>
-#include <climits>
 #include <memory>
 #include <turbojpeg.h>
 #include <type_traits>
@@ -12,6 +11,9 @@ namespace {
 
 struct CloseTurbo {
     void operator()(void* handle) const { tjDestroy(handle); }
+};
+struct FreeTurbo {
+    void operator()(unsigned char* bytes) const { tjFree(bytes); }
 };
 using Turbo = std::unique_ptr<std::remove_pointer_t<tjhandle>, CloseTurbo>;
 
@@ -24,16 +26,16 @@ int Encode(const std::uint8_t* pixels, int width, int height, int pitch, int for
     const Turbo turbo(tjInitCompress());
     if (!turbo)
         return JpegCode::kMemoryError;
-    const auto bound = tjBufSize(width, height, TJSAMP_444);
-    if (bound == static_cast<unsigned long>(-1))
-        return JpegCode::kInvalidProperties;
-    out.resize(bound);
-    auto* target = reinterpret_cast<unsigned char*>(out.data());
-    unsigned long length = bound;
+    unsigned char* target = nullptr;
+    unsigned long length = 0;
     // Full colour resolution: text on coloured ground stays clear.
     const int failed = tjCompress2(turbo.get(), pixels, width, pitch, height, format, &target, &length,
-                                   TJSAMP_444, std::clamp(quality, 1, 100), flags | TJFLAG_NOREALLOC);
-    out.resize(failed == 0 ? length : 0);
+                                   TJSAMP_444, std::clamp(quality, 1, 100), flags);
+    const std::unique_ptr<unsigned char, FreeTurbo> owned(target);
+    if (failed == 0)
+        out.assign(reinterpret_cast<const char*>(target), length);
+    else
+        out.clear();
     return failed == 0 ? JpegCode::kOk : JpegCode::kException;
 }
 

@@ -12,6 +12,8 @@ using access::View;
 namespace {
 
 constexpr int kDetailHeight = 300; ///< of all details printed
+/// A lower detail holds no text: a rule, or the room that something invisible takes.
+constexpr int kLeastDetail = 8;
 constexpr int kMostDetails = 14;
 constexpr int kMostLevels = 10;
 constexpr int kLargestMargin = 56;
@@ -69,7 +71,7 @@ private:
 
     void PrintGroups() {
         const int detail = Height(0);
-        int details = detail <= 0 ? 1 : std::clamp(kDetailHeight / detail, 1, kMostDetails);
+        int details = detail < kLeastDetail ? 1 : std::clamp(kDetailHeight / detail, 1, kMostDetails);
         if (records_ > 0)
             details = std::min(details, records_);
         bool grouped = false;

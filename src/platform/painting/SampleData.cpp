@@ -1,5 +1,6 @@
 #include "platform/painting/SampleData.h"
 
+#include "platform/painting/SampleExpression.h"
 #include "platform/painting/SampleText.h"
 #include "platform/text/Text.h"
 
@@ -70,40 +71,6 @@ std::string WithoutQuotes(std::string text) {
     return text;
 }
 
-/// The field that "[Orders].[Total]" or "Total" names.
-std::string FieldName(std::string_view source) {
-    auto name = text::Trim(source);
-    const auto point = name.rfind('.');
-    if (point != std::string::npos && point + 1 < name.size())
-        name = name.substr(point + 1);
-    std::erase_if(name, [](char letter) { return letter == '[' || letter == ']'; });
-    return name;
-}
-
-/// The field of DLookup("[Title]","Settings"), whose name says what it holds.
-std::string LookedUpField(std::string_view expression) {
-    std::size_t matched = 0;
-    const auto call = text::FindIgnoringCase(expression, "DLookUp(", 0, &matched);
-    if (call == std::string_view::npos)
-        return {};
-    const auto from = expression.find('"', call + matched);
-    const auto to = from == std::string_view::npos ? from : expression.find('"', from + 1);
-    return to == std::string_view::npos ? std::string()
-                                        : FieldName(expression.substr(from + 1, to - from - 1));
-}
-
-/// "CarnivalTitle" as "Carnival Title".
-std::string Spaced(std::string_view name) {
-    std::string spaced;
-    for (const char letter : name) {
-        const bool capital = letter >= 'A' && letter <= 'Z';
-        if (capital && !spaced.empty() && spaced.back() >= 'a' && spaced.back() <= 'z')
-            spaced += ' ';
-        spaced += letter == '_' ? ' ' : letter;
-    }
-    return spaced;
-}
-
 bool IsTrueWord(const std::string& word) {
     return text::EqualsIgnoringCase(word, "True") || text::EqualsIgnoringCase(word, "Yes") || word == "-1" ||
            word == "1";
@@ -112,53 +79,6 @@ bool IsTrueWord(const std::string& word) {
 bool IsCheck(const DesignObject& control) {
     return control.Is("CheckBox") || control.Is("OptionButton") || control.Is("ToggleButton");
 }
-
-/// Joins what an expression joins: literals, fields and the simple functions around them.
-class Joiner {
-public:
-    template <typename FieldText>
-    static std::string Join(std::string_view expression, const FieldText& fieldText, bool& known) {
-        std::string result;
-        known = true;
-        for (std::size_t at = 0; at < expression.size() && known;) {
-            const char letter = expression[at];
-            if (letter == '"') {
-                const auto end = std::min(expression.find('"', at + 1), expression.size());
-                result += expression.substr(at + 1, end - at - 1);
-                at = end + 1;
-            } else if (letter == '[') {
-                const auto end = std::min(expression.find(']', at), expression.size());
-                result += fieldText(expression.substr(at + 1, end - at - 1));
-                at = end + 1;
-            } else if (letter == '&' || letter == '+' || letter == ' ' || letter == '(' || letter == ')' ||
-                       letter == '$') {
-                ++at;
-            } else {
-                at = Word(expression, at, result, known);
-            }
-        }
-        return result;
-    }
-
-private:
-    static std::size_t Word(std::string_view expression, std::size_t at, std::string& result, bool& known) {
-        auto end = at;
-        while (end < expression.size() && (std::isalnum(static_cast<unsigned char>(expression[end])) != 0))
-            ++end;
-        const auto word = text::FoldCase(expression.substr(at, end - at));
-        if (!word.empty() && word.find_first_not_of("0123456789") == std::string::npos)
-            result += word;
-        else if (word == "date" || word == "now")
-            result += word == "now" ? "3/14/2024 9:30:00 AM" : "3/14/2024";
-        else if (word == "time")
-            result += "9:30:00 AM";
-        else if (word == "page" || word == "pages")
-            result += '1';
-        else
-            known = word == "trim" || word == "ucase" || word == "lcase" || word == "nz" || word == "str";
-        return end == at ? at + 1 : end;
-    }
-};
 
 } // namespace
 
@@ -214,24 +134,16 @@ std::string SampleData::FieldText(const DesignObject& control, std::string_view 
 }
 
 std::string SampleData::Expression(const DesignObject& control, std::string_view expression, int row) const {
-    bool known = true;
-    const auto joined = Joiner::Join(
-        expression,
-        [&](std::string_view field) {
-            if (text::EqualsIgnoringCase(field, "Page") || text::EqualsIgnoringCase(field, "Pages"))
-                return std::string("1");
-            return FieldText(control, field, row);
-        },
-        known);
-    if (known)
-        return Formatted(joined, control.Text("Format"));
-    for (const auto* sum : {"Sum(", "Count(", "Avg(", "Max(", "Min(", "DCount(", "DSum("})
-        if (text::ContainsIgnoringCase(expression, sum))
-            return SampleText(SampleKind::Number, control.Text("Format"), "", row);
     const auto format = control.Text("Format");
+    const auto joined =
+        JoinExpression(expression, [&](std::string_view field) { return FieldText(control, field, row); });
+    if (joined)
+        return Formatted(*joined, format);
+    if (IsAggregate(expression))
+        return SampleText(SampleKind::Number, format, "", row);
     const auto field = LookedUpField(expression);
     if (!field.empty() && KindOf(format, field) == SampleKind::Text && !HasSampleWords(field))
-        return Spaced(field);
+        return SpacedName(field);
     const auto& name = field.empty() ? control.name : field;
     return SampleText(KindOf(format, name), format, name, row);
 }
