@@ -117,10 +117,10 @@ void ObjectTopic::TakeOver() {
     generator_.HelpContextIds().ExtractUsedHelpContextIds(*form_);
     const bool pictured = type_ == ObjectType::kForm ||
                           (type_ == ObjectType::kReport && generator_.Parameters().AddImageForReport);
-    const std::int32_t window = host.ActivateComponent(type_, node_.Name(), /*forceOpenInDesignView=*/false,
-                                                       /*forceOpenAsHidden=*/false);
     if (!pictured)
         return;
+    const std::int32_t window = host.ActivateComponent(type_, node_.Name(), /*forceOpenInDesignView=*/false,
+                                                       /*forceOpenAsHidden=*/false);
     Screenshot().LocateObjectsAndTakeScreenshots(generator_.Parameters().ImagesType(), window,
                                                  form_->XMLSTr());
     ++Stats().ScreenshotsQty;

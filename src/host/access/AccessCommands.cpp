@@ -196,21 +196,4 @@ void RunAccessCommand(CN_IDEAccContext& context, CXmlCommand& command) {
     handler->second(context, command);
 }
 
-std::string NamePrefixOf(CN_IDEAccContext& context, std::int32_t objectType) {
-    switch (objectType) {
-    case ObjectType::kForm:
-        return context.FormNamePrefix();
-    case ObjectType::kReport:
-        return context.ReportNamePrefix();
-    case ObjectType::kTable:
-        return context.TableNamePrefix();
-    case ObjectType::kQuery:
-        return context.QueryNamePrefix();
-    case ObjectType::kMacro:
-        return context.MacroNamePrefix();
-    default:
-        return {};
-    }
-}
-
 } // namespace tovimar

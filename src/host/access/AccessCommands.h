@@ -12,7 +12,4 @@ class CXmlCommand;
 /// 0x80040001 "Undefined callback command [NAME]" for an unknown one.
 void RunAccessCommand(CN_IDEAccContext& context, CXmlCommand& command);
 
-/// Prefix of object names by type; empty for types that have none.
-std::string NamePrefixOf(CN_IDEAccContext& context, std::int32_t objectType);
-
 } // namespace tovimar

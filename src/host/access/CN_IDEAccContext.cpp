@@ -321,7 +321,7 @@ std::string CN_IDEAccContext::ProcessComponent(const CXmlCommand& command) {
     std::string description;
     if (entry)
         description = CClientUIObjectRawXml().Get_(*formProcessor_, type, entry, hostWindow, sourceType,
-                                                   NamePrefixOf(*this, type), keepOpen, previewOnly);
+                                                   std::string(), keepOpen, previewOnly);
     if (description.empty())
         throw RaisedError(kFailure2, "Error processing source project component [" + name + "]", kClass);
     return description;
