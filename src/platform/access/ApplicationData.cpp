@@ -20,28 +20,6 @@ std::string ReadText(const std::string& path) {
     return DecodeExportText(Env().files->ReadFile(path));
 }
 
-Records::Type RecordType(FieldType type) {
-    switch (type) {
-    case FieldType::Boolean:
-        return Records::Type::Boolean;
-    case FieldType::Currency:
-        return Records::Type::Currency;
-    case FieldType::Date:
-        return Records::Type::DateTime;
-    case FieldType::Text:
-    case FieldType::Guid:
-        return Records::Type::Text;
-    case FieldType::Memo:
-        return Records::Type::Memo;
-    case FieldType::Binary:
-    case FieldType::LongBinary:
-    case FieldType::Attachment:
-        return Records::Type::Binary;
-    default:
-        return Records::Type::Number;
-    }
-}
-
 bool IsStatement(const std::string& source) {
     for (const auto* word : {"SELECT", "PARAMETERS", "TRANSFORM", "("})
         if (text::StartsWithIgnoringCase(source, word))

@@ -3,6 +3,7 @@
 #include "platform/Environment.h"
 #include "platform/Error.h"
 #include "platform/access/ExportReader.h"
+#include "platform/access/HexDigit.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
@@ -256,13 +257,6 @@ private:
     ApplicationFolder folder_;
     std::size_t seen_ = 0;
 };
-
-int HexDigit(char digit) {
-    if (digit >= '0' && digit <= '9')
-        return digit - '0';
-    const char lower = static_cast<char>(digit | 0x20);
-    return lower >= 'a' && lower <= 'f' ? lower - 'a' + 10 : -1;
-}
 
 } // namespace
 

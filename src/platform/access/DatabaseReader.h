@@ -28,6 +28,9 @@ struct DatabaseContent {
 /// Raises 0x80040001 "<path>: <reason>" for a file that can't be read as a database.
 DatabaseContent ReadDatabase(const std::string& nativePath);
 
+/// How a field's content shows to a reader.
+Records::Type RecordType(FieldType type);
+
 /// Columns and the first records of a table; raises as ReadDatabase, and when the table is absent.
 Records ReadTableRecords(const std::string& nativePath, const std::string& table, int rows);
 

@@ -1,5 +1,6 @@
 #include "platform/Error.h"
 #include "platform/access/ExportReader.h"
+#include "platform/access/HexDigit.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
@@ -10,13 +11,6 @@ namespace {
 
 constexpr std::size_t kMaxDepth = 200;
 constexpr std::size_t kMaxBytes = std::size_t{256} << 20;
-
-int HexDigit(char digit) {
-    if (digit >= '0' && digit <= '9')
-        return digit - '0';
-    const char lower = static_cast<char>(digit | 0x20);
-    return lower >= 'a' && lower <= 'f' ? lower - 'a' + 10 : -1;
-}
 
 bool IsOctal(char digit) {
     return digit >= '0' && digit <= '7';

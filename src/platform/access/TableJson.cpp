@@ -54,7 +54,7 @@ std::string Text(const Json& value) {
 }
 
 std::int32_t Number(const Json& value) {
-    return value.is_number() ? static_cast<std::int32_t>(value.get<std::int64_t>()) : 0;
+    return value.is_number_integer() ? static_cast<std::int32_t>(value.get<std::int64_t>()) : 0;
 }
 
 void ReadProperties(const Json& properties, NamedTexts& texts) {
