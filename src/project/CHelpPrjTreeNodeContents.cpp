@@ -87,7 +87,8 @@ std::string ControlText(const CFormHTMLControlDef& entry) {
 std::string CHelpPrjTreeNode::ContentsLink() const {
     auto link = GeneratedHTMLFile();
     if (IsControl || IsMenu)
-        link += '#' + GetComponentFileName(platform::BaseNameOf(XmlFormFileName()), Name());
+        link += '#' + GetComponentFileName(Parent ? Parent->Name() : platform::BaseNameOf(XmlFormFileName()),
+                                           Name());
     return text::ReplaceAll(link, "\"", "&quot;");
 }
 

@@ -19,13 +19,29 @@ namespace {
 /// A line of fields is broken before each field of this number.
 constexpr std::size_t kFieldsToABreak = 6;
 
-std::string TopicBaseName(const std::string& table) {
+/// The topic of a table, or of a query that is read like one; nothing where the project has no such topic.
+/// Without a project the name itself serves.
+std::string TopicBaseName(const std::string& source) {
     CHelpPrjTree* tree = Session::HelpProjectTree();
-    const std::string file = tree == nullptr ? std::string() : tree->GetNodeHtmlFileNameNoExt(table, "Table");
-    return NormalizeName(file.empty() ? table : file);
+    if (tree == nullptr)
+        return NormalizeName(source);
+    std::string file = tree->GetNodeHtmlFileNameNoExt(source, "Table");
+    if (file.empty())
+        file = tree->GetNodeHtmlFileNameNoExt(source, "Query");
+    return NormalizeName(file);
 }
 
-std::string FieldLine(const XmlNode& table, const std::string& file) {
+/// "label|field": shown as the one, linked by the other, to the anchor that the table's topic gives the
+/// field.
+std::string FieldText(const std::string& labelAndField, const std::string& source, const std::string& file) {
+    const auto parts = text::Split(labelAndField, "|");
+    if (file.empty())
+        return parts.front();
+    return "<A href=\"" + file + ".htm#" + NormalizeName(source) + "_" + NormalizeName(parts.back()) + "\">" +
+           parts.front() + "</A>";
+}
+
+std::string FieldLine(const XmlNode& table, const std::string& source, const std::string& file) {
     std::string line;
     std::size_t number = 0;
     for (const XmlNode& field : table.childElements()) {
@@ -33,10 +49,7 @@ std::string FieldLine(const XmlNode& table, const std::string& file) {
             line += ", ";
         if (number % kFieldsToABreak == 0)
             line += "<BR>";
-        // "label|field": shown as the one, linked by the other.
-        const auto parts = text::Split(field.attribute("Name"), "|");
-        line.append("<A href=\"").append(file).append(".htm#").append(file).append("_");
-        line.append(NormalizeName(parts.back())).append("\">").append(parts.front()).append("</A>");
+        line += FieldText(field.attribute("Name"), source, file);
     }
     return line;
 }
@@ -46,8 +59,11 @@ void AppendInheritedFields(std::string& out, const XmlNode& inherited) {
     for (const XmlNode& table : inherited.childElements()) {
         const std::string name = table.attribute("Name");
         const std::string file = TopicBaseName(name);
-        out.append("<P>").append(FieldLine(table, file)).append("&nbsp;from <A href=\"").append(file);
-        out.append(".htm\">").append(EncodeXmlText(name)).append("</A>&nbsp;table.</P>\r\n");
+        out.append("<P>").append(FieldLine(table, name, file)).append("&nbsp;from ");
+        if (file.empty())
+            out.append(EncodeXmlText(name)).append("</P>\r\n");
+        else
+            out.append("<A href=\"" + file + ".htm\">" + EncodeXmlText(name) + "</A>&nbsp;table.</P>\r\n");
     }
 }
 

@@ -38,8 +38,8 @@ std::string FieldLinks(const HostObject& relation, const std::string& foreignTab
         if (topic.empty())
             links.push_back(AsHtml(name));
         else
-            links.push_back("<A href=\"" + topic + ".htm#" + topic + "_" + NormalizeName(name) + "\">" +
-                            AsHtml(name) + "</A>");
+            links.push_back("<A href=\"" + topic + ".htm#" + NormalizeName(foreignTable) + "_" +
+                            NormalizeName(name) + "\">" + AsHtml(name) + "</A>");
     });
     return text::Join(links, ", ");
 }
