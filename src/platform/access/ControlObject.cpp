@@ -33,6 +33,7 @@ const MemberTable<ControlObject>& ControlObject::Members() {
         {"ControlType", &ControlObject::ReadControlType},
         {"Parent", &ControlObject::ReadParent},
         {"Section", &ControlObject::ReadSection},
+        {"Visible", &ControlObject::ReadVisible},
         {"Controls", &ControlObject::ReadControls},
         {"Pages", &ControlObject::ReadPages},
         {"PageIndex", &ControlObject::ReadPageIndex},
@@ -95,6 +96,16 @@ Value ControlObject::ReadParent(const Arguments&) {
 
 Value ControlObject::ReadSection(const Arguments&) {
     return Window()->SectionOf(*design_);
+}
+
+/// What stands in a section that the view hides isn't to be seen, whatever the control itself says.
+Value ControlObject::ReadVisible(const Arguments&) {
+    const auto window = Window();
+    const auto number = window->SectionOf(*design_);
+    const auto* section = window->Opened().design->Section(number);
+    if (section && !SectionIsShown(window->Opened().view, number, section->Flag("Visible")))
+        return false;
+    return ReadOther("Visible", {});
 }
 
 std::shared_ptr<CollectionObject> ControlObject::Children() {

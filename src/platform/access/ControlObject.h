@@ -37,6 +37,7 @@ private:
     Value ReadControlType(const Arguments&);
     Value ReadParent(const Arguments&);
     Value ReadSection(const Arguments&);
+    Value ReadVisible(const Arguments&);
     Value ReadControls(const Arguments& arguments);
     Value ReadPages(const Arguments& arguments);
     Value ReadPageIndex(const Arguments&);

@@ -38,15 +38,23 @@ private:
     std::string name_;
 };
 
+/// Forms and reports of which only the name is known can't be opened, so the catalogue leaves them out; a
+/// summary of the application names them.
+bool IsListed(const ApplicationModel& model, ObjectKind kind, const std::string& name) {
+    return (kind != ObjectKind::Form && kind != ObjectKind::Report) || model.DesignKnown(kind, name);
+}
+
 Value Catalogue(const SessionRef& session, const char* className, ObjectKind kind,
                 const AutomationObject::Arguments& arguments) {
     const auto& model = Live(session)->Model();
-    if (!arguments.empty() && arguments[0].IsString() && model.Contains(kind, arguments[0].AsString()))
+    if (!arguments.empty() && arguments[0].IsString() && model.Contains(kind, arguments[0].AsString()) &&
+        IsListed(model, kind, arguments[0].AsString()))
         return ObjectValue(
             std::make_shared<CatalogueObject>(session, kind, model.NameOf(kind, arguments[0].AsString())));
     const auto list = std::make_shared<CollectionObject>(className, 0, NoSuchObject());
     for (const auto& name : model.Names(kind))
-        list->Add(name, std::make_shared<CatalogueObject>(session, kind, name));
+        if (IsListed(model, kind, name))
+            list->Add(name, std::make_shared<CatalogueObject>(session, kind, name));
     return ListOrItem(list, arguments);
 }
 

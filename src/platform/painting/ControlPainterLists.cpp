@@ -1,4 +1,5 @@
 #include "platform/painting/ControlPainter.h"
+#include "platform/painting/TabStrip.h"
 
 #include "platform/painting/ObjectPainter.h"
 #include "platform/text/Text.h"
@@ -10,8 +11,6 @@ namespace tovimar::platform::painting {
 using access::DesignObject;
 
 namespace {
-
-constexpr std::size_t kMostPages = 200;
 
 /// Columns without a width of their own share what the others leave, at least an inch each.
 std::vector<int> PixelWidths(const std::vector<int>& twips, int available, int twipsPerPixel) {
@@ -25,19 +24,6 @@ std::vector<int> PixelWidths(const std::vector<int>& twips, int available, int t
     for (const int width : twips)
         pixels.push_back(width < 0 ? share : width / twipsPerPixel);
     return pixels;
-}
-
-std::string PageCaption(const DesignObject& page) {
-    const auto caption = page.Text("Caption");
-    return caption.empty() ? page.name : caption;
-}
-
-std::vector<const DesignObject*> PagesOf(const DesignObject& tab) {
-    std::vector<const DesignObject*> pages;
-    for (const auto& child : tab.children)
-        if (child->Is("Page") && pages.size() < kMostPages)
-            pages.push_back(child.get());
-    return pages;
 }
 
 } // namespace
@@ -93,16 +79,8 @@ std::size_t ControlPainter::CurrentPage(const Object& tab) const {
 }
 
 void ControlPainter::PaintTabHeads(const Object& control, const Rectangle& area, std::size_t current) {
-    access::TabInput input;
-    input.controlLeft = area.left;
-    input.controlTop = area.top;
-    input.fixedWidth = control.Integer("TabFixedWidth", 0);
-    input.fixedHeight = control.Integer("TabFixedHeight", 0);
-    input.fontSize = control.Integer("FontSize", 8);
-    input.fontWeight = control.Integer("FontWeight", 400);
     const auto pages = PagesOf(control);
-    for (const auto* page : pages)
-        input.captions.push_back(PageCaption(*page));
+    const auto input = TabInputOf(control, area.left, area.top);
     const auto style = StyleOf(control);
     for (std::size_t i = 0; i < pages.size(); ++i) {
         if (!IsShown(*pages[i]))

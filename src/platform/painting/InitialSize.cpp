@@ -3,6 +3,7 @@
 #include "platform/painting/ObjectLayout.h"
 #include "platform/painting/ReportPage.h"
 #include "platform/painting/SampleData.h"
+#include "platform/painting/TabStrip.h"
 
 #include <algorithm>
 
@@ -23,8 +24,21 @@ struct Size {
     int height = 0;
 };
 
+/// Right edge of what stands on the surface: tabs may reach beyond their control, and a damaged design may
+/// place a control beyond its form.
+int SurfaceWidth(const Design& design, const SystemMetrics& metrics) {
+    int width = painting::PixelsOf(*design.root, "Width", metrics.twipsPerPixelX);
+    for (const auto& section : design.Sections())
+        for (const auto& control : section.object->children) {
+            const int left = painting::PixelsOf(*control, "Left", metrics.twipsPerPixelX);
+            width = std::max(width, left + painting::PixelsOf(*control, "Width", metrics.twipsPerPixelX));
+            if (control->Is("Tab"))
+                width = std::max(width, left + painting::TabStripWidth(*control, metrics));
+        }
+    return width;
+}
+
 Size DesignSize(const OpenObject& object, const SystemMetrics& metrics) {
-    const auto& root = *object.design->root;
     const auto sections = object.design->Sections();
     double height = kDesignMarginY;
     for (const auto& section : sections)
@@ -33,8 +47,7 @@ Size DesignSize(const OpenObject& object, const SystemMetrics& metrics) {
     const int bars =
         static_cast<int>(sections.size()) * (ComputeFrame(metrics, object.FrameSettings()).sectionBarHeight -
                                              kDesignBar / metrics.twipsPerPixelY);
-    return {painting::PixelsOf(root, "Width", metrics.twipsPerPixelX) +
-                kDesignMarginX / metrics.twipsPerPixelX,
+    return {SurfaceWidth(*object.design, metrics) + kDesignMarginX / metrics.twipsPerPixelX,
             RoundToEven(height / metrics.twipsPerPixelY) + bars};
 }
 
@@ -44,8 +57,8 @@ Size FormSize(const OpenObject& object, const SystemMetrics& metrics) {
     const int records = painting::ShownRecordsOf(design, object.view, 0, metrics);
     const auto heights = painting::HeightsOf(design, object.view, records, metrics);
     Size size;
-    size.width = painting::PixelsOf(root, "Width", metrics.twipsPerPixelX) +
-                 ComputeFrame(metrics, object.FrameSettings()).recordSelectorWidth;
+    size.width =
+        SurfaceWidth(design, metrics) + ComputeFrame(metrics, object.FrameSettings()).recordSelectorWidth;
     for (const int height : heights.pixels)
         size.height += height;
     size.height += painting::NavigationHeight(design, metrics);
