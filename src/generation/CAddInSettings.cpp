@@ -1,6 +1,7 @@
 #include "generation/CAddInSettings.h"
 
 #include "foundation/CAddInSettingsXmlFile.h"
+#include "foundation/CCodePages.h"
 #include "foundation/CTraceLog.h"
 #include "foundation/ErrorTrap.h"
 #include "foundation/Product.h"
@@ -10,6 +11,7 @@
 #include "platform/Environment.h"
 #include "platform/text/Text.h"
 
+#include <cstdlib>
 #include <variant>
 
 namespace tovimar {
@@ -195,6 +197,19 @@ struct Saving {
     }
 };
 
+/// Contents, index and compiler project are plain text of a code page: that of the pages' charset, or of the
+/// help's language when the pages are Unicode.
+int AnsiCodePageOf(const Parameters& parameters) {
+    constexpr int kUtf8 = 65001;
+    const int page = text::CodePageByCharsetName(parameters.Charset);
+    if (page != 0 && page != kUtf8)
+        return page;
+    CCodePages pages;
+    const CCodePage* language = pages.GetCodePageByLanguageCode(text::Trim(parameters.LanguageCode));
+    const int number = language == nullptr ? 0 : std::atoi(language->CP1.c_str());
+    return number > 0 ? number : 1252;
+}
+
 } // namespace
 
 void CAddInSettings::Load(ISettings& rISettings, bool vfLoadFromProjectFile) {
@@ -211,6 +226,7 @@ void CAddInSettings::Load(ISettings& rISettings, bool vfLoadFromProjectFile) {
                 load(option, value);
     for (const Option& option : Options())
         load(option, rISettings.OptionValue(option.description.name));
+    PassOver([&] { text::SetAnsiCodePage(AnsiCodePageOf(*parameters)); });
     if (parameters->AutomatedTestModeOn)
         SetUnattendedMessages(true, Session::TraceLog());
 }

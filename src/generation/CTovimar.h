@@ -16,6 +16,14 @@ class CXmlForm;
 class clsFrmRptHelpContextIds;
 class clsHHK;
 
+/// The node that a pass has come to, for a program's own display.
+struct NodeProgress {
+    std::string kind; ///< "Form", "Table", ...; empty for pages
+    std::string name; ///< of the object, or the page's caption
+    std::int32_t position = 0;
+    std::int32_t maximum = 0;
+};
+
 /// One generation: the parameters of the run, the project tree, the index and the help context ids, and the
 /// way from settled options to the compiled help beside the source project. One per connection; the server
 /// data owns it. Failures are reported under the class's name; a run is judged by `RunState` alone.
@@ -77,6 +85,8 @@ public:
     /// Shows the help editor on the tree; none in a program without windows, which then asks nothing about
     /// it.
     std::function<void()> OpenHelpEditor;
+    /// Called for every node of a pass before it is made.
+    std::function<void(const NodeProgress&)> NodeStarted;
     /// What the help compiler of the last run printed, and its exit code; empty and 0 when it didn't run.
     std::string CompilerOutput;
     int CompilerExitCode = 0;

@@ -26,10 +26,27 @@ std::string FolderOfCopiedHelp() {
     return platform::FolderOf(HostAgent().CurrentSourceProjectFullPath());
 }
 
+/// What a compiler leaves that was ended in its work: a file that is cut and its working copy of the project.
+void RemoveLeavings(const CAddInProject& project) {
+    auto& files = *platform::Env().files;
+    PassOver([&] {
+        for (const std::string& copy : files.ListFiles(project.Folder, "~hhc*.hhp"))
+            files.DeleteFile(platform::Join(project.Folder, copy));
+        if (files.FileExists(project.CHMFullPath()))
+            files.DeleteFile(project.CHMFullPath());
+    });
+}
+
 void RunCompiler(const CAddInProject& project) {
     const std::string projectFile = platform::Join(project.Folder, project.Name + ".hhp");
     const std::string commandLine = "\"" + GetHtmlHelpWorkshopExePath() + "hhc.exe\" \"" + projectFile + "\"";
-    const auto outcome = platform::Env().processes->RunAndWait(commandLine);
+    platform::Processes::Outcome outcome;
+    try {
+        outcome = platform::Env().processes->RunAndWait(commandLine);
+    } catch (const RaisedError&) {
+        RemoveLeavings(project);
+        throw;
+    }
     Session::TraceLog()->addMessage("hhc.exe: " + outcome.output);
     if (auto* generator = Session::Generator()) {
         generator->CompilerOutput = outcome.output;

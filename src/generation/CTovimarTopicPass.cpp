@@ -74,6 +74,11 @@ void ShowNode(const CHelpPrjTreeNode& node, std::int32_t level, Walk& walk) {
     ++walk.counter;
     HostAgent().ProgressMeterInit(MeterText(node, level), walk.maxNodes);
     HostAgent().ProgressMeterUpdate(walk.counter);
+    if (!walk.generator.NodeStarted)
+        return;
+    const std::string kind = node.NodeComponentTypeName();
+    walk.generator.NodeStarted(
+        {kind, kind.empty() ? node.Caption() : node.Name(), walk.counter, walk.maxNodes});
 }
 
 /// The ids of an object that isn't made again still count as used.

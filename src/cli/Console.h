@@ -1,0 +1,70 @@
+#pragma once
+
+#include "platform/Environment.h"
+
+#include <memory>
+#include <string>
+
+/// What the program shows: messages on standard error, results on standard output, paths native.
+namespace tovimar::cli {
+
+/// "tovimar: error: " and the text; further lines indented.
+void PrintError(const std::string& text);
+void PrintWarning(const std::string& text);
+/// Without a prefix, on standard error.
+void PrintHint(const std::string& text);
+/// On standard output.
+void PrintResult(const std::string& text);
+
+/// On a terminal one line with a bar that is written over and over; elsewhere nothing but `Phase`, or with
+/// `verbose` a line per object.
+class ProgressLine {
+public:
+    explicit ProgressLine(bool verbose);
+    ~ProgressLine() { Clear(); }
+    ProgressLine(const ProgressLine&) = delete;
+    ProgressLine& operator=(const ProgressLine&) = delete;
+
+    void Phase(const std::string& text);
+    void Object(const std::string& kind, const std::string& name, int position, int maximum);
+    /// Takes the line away before something else is printed.
+    void Clear();
+
+private:
+    void Draw(const std::string& text);
+
+    bool terminal_;
+    bool verbose_;
+    bool drawn_ = false;
+};
+
+/// Boxes nobody can answer: the text is printed, the default button answers, and what would leave the
+/// program, such as a mail with a report, is declined.
+class ConsoleMessageBoxes : public platform::MessageBoxes {
+public:
+    ConsoleMessageBoxes(ProgressLine& progress, bool verbose) : progress_(progress), verbose_(verbose) {}
+    int Show(const std::string& text, std::uint32_t flags, const std::string& title) override;
+
+    /// Warnings are why the program stops, as long as this is set.
+    bool warningsStop = false;
+    /// How many errors were told.
+    int errors = 0;
+
+private:
+    ProgressLine& progress_;
+    bool verbose_;
+};
+
+/// The steps of the run as phases.
+class PhaseView : public platform::ProgressView {
+public:
+    explicit PhaseView(ProgressLine& progress) : progress_(progress) {}
+    void Begin(const std::string& message, std::int32_t maximum) override;
+    void Update(const std::string&, std::int32_t) override {}
+    void End() override {}
+
+private:
+    ProgressLine& progress_;
+};
+
+} // namespace tovimar::cli
