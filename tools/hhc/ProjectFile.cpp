@@ -5,6 +5,7 @@
 #include <cctype>
 #include <cerrno>
 #include <cstdlib>
+#include <fstream>
 #include <iconv.h>
 #include <map>
 #include <set>
@@ -109,15 +110,10 @@ private:
         } else if (section_ == "[files]" && !line.empty()) {
             AppendFile(line);
         } else if (section_ == "[alias]" && line.find('=') != std::string::npos) {
-            const auto sign = line.find('=');
-            Put(line.substr(0, sign + 1) + OnDisk(Trimmed(std::string_view(line).substr(sign + 1))));
-        } else if (line.starts_with("#include ")) {
-            const std::string name = OnDisk(Trimmed(std::string_view(line).substr(9)));
-            // A text popup file is no header; the compiler only knows headers and breaks off without the
-            // file.
-            if (Exists(name))
-                Put("#include " + name);
-        } else {
+            AppendAlias(line);
+        } else if (section_ == "[map]") {
+            AppendMapLine(line);
+        } else if (section_ != "[text popups]") {
             Put(line);
         }
     }
@@ -138,6 +134,34 @@ private:
         } else {
             Put(line);
         }
+    }
+
+    void AppendAlias(const std::string& line) {
+        const auto sign = line.find('=');
+        const std::string page = OnDisk(Trimmed(std::string_view(line).substr(sign + 1)));
+        if (!Exists(page))
+            return;
+        aliases_.insert(Trimmed(std::string_view(line).substr(0, sign)));
+        Put(line.substr(0, sign + 1) + page);
+    }
+
+    /// The compiler breaks off over a number without an alias, such as that of a list page which the
+    /// application kept out of its help, so the defines of a header are put in one by one.
+    void AppendMapLine(const std::string& line) {
+        if (!line.starts_with("#include ")) {
+            AppendDefine(line);
+            return;
+        }
+        std::ifstream header(folder_ / OnDisk(Trimmed(std::string_view(line).substr(9))));
+        for (std::string define; std::getline(header, define);)
+            AppendDefine(Trimmed(define));
+    }
+
+    void AppendDefine(const std::string& line) {
+        std::istringstream words(line);
+        std::string define, name, number;
+        if (words >> define >> name >> number && define == "#define" && aliases_.contains(name))
+            Put("#define " + name + " " + number);
     }
 
     void AppendFile(const std::string& line) {
@@ -200,6 +224,7 @@ private:
     std::string section_;
     std::map<std::string, std::map<std::string, std::string>> listings_;
     std::set<std::string> listed_;
+    std::set<std::string> aliases_;
     TranslatedProject result_;
 };
 
