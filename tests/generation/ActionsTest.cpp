@@ -59,7 +59,7 @@ TEST_F(ActionsTest, FolderOfAnotherApplicationIsRefused) {
                                 "<Form SourceProjectName=\"Library\"/></Project></TovimarProject>");
     ASSERT_TRUE(actions.PrepareProject(Request()));
     EXPECT_EQ(CTovimarActions::kOtherFolder, actions.CheckIfGenerationPossible());
-    EXPECT_EQ("Target folder '" + Path("help\\") +
+    EXPECT_EQ("Target folder '" + Native(Path("help\\")) +
                   "'\r\nalready has Tovimar project 'Shop.tvp'.\r\n\r\nPlease select another target folder.",
               LastBox());
 }
@@ -78,7 +78,7 @@ TEST_F(ActionsTest, ProjectOfTheSameSourceIsMadeAnewUnderItsIdentifiers) {
 TEST_F(ActionsTest, FolderIsTestedBeforeAnythingIsWritten) {
     Parameters().SetFolderForGeneratedHelp(Path("50%#"));
     EXPECT_EQ(kSuccess, actions.CheckIfGenerationPossible()) << "the default answer goes on";
-    EXPECT_EQ("Target folder '" + Path("50%#\\") +
+    EXPECT_EQ("Target folder '" + Native(Path("50%#\\")) +
                   "' contains character '%'\r\n"
                   "A help file (.chm) will not work correctly in folders with that character.\r\n"
                   "Do you want to select another target folder?",
@@ -89,7 +89,7 @@ TEST_F(ActionsTest, FolderIsTestedBeforeAnythingIsWritten) {
     WriteFile("file", "");
     Parameters().SetFolderForGeneratedHelp(Path("file\\help"));
     EXPECT_EQ(CTovimarActions::kNoFolder, actions.CheckIfGenerationPossible());
-    EXPECT_EQ("Target folder '" + Path("file\\help\\") +
+    EXPECT_EQ("Target folder '" + Native(Path("file\\help\\")) +
                   "'\r\n cannot be created.\r\nPlease select or enter another target folder name.",
               LastBox());
 }

@@ -37,6 +37,7 @@ protected:
         environment->files->MakeFolders(project->Folder);
         Parameters().SetFolderForGeneratedHelp(project->Folder);
         Parameters().SetHelpProjectName("Shop");
+        Generator().HelpProjectTree();
     }
 
     CTovimar& Generator() { return server.ServerData()->Generator(); }
@@ -45,6 +46,8 @@ protected:
     bool HelpFileExists(const std::string& name) {
         return environment->files->FileExists(project->Folder + name);
     }
+    /// As a message box shows a path.
+    std::string Native(const std::string& path) { return environment->files->ToNative(path); }
     long Sent(const std::string& command) const { return std::count(sent.begin(), sent.end(), command); }
 
     /// `RetValue` by command name; a command without an entry gets none.
