@@ -15,7 +15,8 @@ void Write(const std::filesystem::path& path, const std::string& text) {
 std::string Place(int left, int top, int width, int height) {
     std::ostringstream out;
     out << "                    Left =" << left << "\r\n                    Top =" << top
-        << "\r\n                    Width =" << width << "\r\n                    Height =" << height << "\r\n";
+        << "\r\n                    Width =" << width << "\r\n                    Height =" << height
+        << "\r\n";
     return out.str();
 }
 
@@ -25,8 +26,9 @@ std::string LabelledBox(int index) {
     const int left = index % 2 * 5400 + 120;
     const std::string number = std::to_string(index);
     return "                Begin TextBox\r\n" + Place(left + 1800, top, 3000, 300) +
-           "                    Name =\"txtField" + number + "\"\r\n                    ControlSource =\"Field" +
-           number + "\"\r\n                    StatusBarText =\"What field " + number +
+           "                    Name =\"txtField" + number +
+           "\"\r\n                    ControlSource =\"Field" + number +
+           "\"\r\n                    StatusBarText =\"What field " + number +
            " is for\"\r\n                    Begin\r\n                        Begin Label\r\n" +
            Place(left, top, 1700, 300) + "                            Name =\"lblField" + number +
            "\"\r\n                            Caption =\"Field &" + number +
@@ -35,12 +37,13 @@ std::string LabelledBox(int index) {
 
 std::string Design(const std::string& kind, int number) {
     const std::string name = std::to_string(number);
-    std::string text = "Version =21\r\nVersionRequired =20\r\nBegin " + kind + "\r\n    Width =11000\r\n" +
-                       "    RecordSource =\"tbl" + name + "\"\r\n    Caption =\"" + kind + " number " + name +
-                       "\"\r\n    Begin\r\n        Begin Label\r\n            FontSize =9\r\n            FontName "
-                       "=\"Calibri\"\r\n        End\r\n        Begin TextBox\r\n            FontSize =9\r\n       "
-                       "     FontName =\"Calibri\"\r\n        End\r\n        Begin Section\r\n            Height "
-                       "=5400\r\n            Name =\"Detail\"\r\n            Begin\r\n";
+    std::string text =
+        "Version =21\r\nVersionRequired =20\r\nBegin " + kind + "\r\n    Width =11000\r\n" +
+        "    RecordSource =\"tbl" + name + "\"\r\n    Caption =\"" + kind + " number " + name +
+        "\"\r\n    Begin\r\n        Begin Label\r\n            FontSize =9\r\n            FontName "
+        "=\"Calibri\"\r\n        End\r\n        Begin TextBox\r\n            FontSize =9\r\n       "
+        "     FontName =\"Calibri\"\r\n        End\r\n        Begin Section\r\n            Height "
+        "=5400\r\n            Name =\"Detail\"\r\n            Begin\r\n";
     for (int i = 0; i < 24; ++i)
         text += LabelledBox(i);
     return text + "            End\r\n        End\r\n    End\r\nEnd\r\n";
@@ -58,8 +61,9 @@ void WriteSyntheticApplication(const std::filesystem::path& folder, int objects)
             break;
         case 8:
             Write(folder / "tbldefs" / ("tbl" + name + ".sql"),
-                  "CREATE TABLE [tbl" + name + "] (\r\n  [ID] AUTOINCREMENT CONSTRAINT [PrimaryKey] PRIMARY KEY,\r\n"
-                  "  [Name] VARCHAR (50),\r\n  [Price] CURRENCY\r\n)\r\n");
+                  "CREATE TABLE [tbl" + name +
+                      "] (\r\n  [ID] AUTOINCREMENT CONSTRAINT [PrimaryKey] PRIMARY KEY,\r\n"
+                      "  [Name] VARCHAR (50),\r\n  [Price] CURRENCY\r\n)\r\n");
             break;
         case 9:
             Write(folder / "queries" / ("qry" + name + ".sql"),

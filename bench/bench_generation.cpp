@@ -52,8 +52,8 @@ Run Generate(const fs::path& source, const fs::path& output) {
     if (child == 0) {
         std::freopen("/dev/null", "w", stdout);
         std::freopen("/dev/null", "w", stderr);
-        execl(TOVIMAR_PROGRAM, "tovimar", "generate", source.c_str(), "--output", output.c_str(), "--no-compile",
-              nullptr);
+        execl(TOVIMAR_PROGRAM, "tovimar", "generate", source.c_str(), "--output", output.c_str(),
+              "--no-compile", nullptr);
         _exit(127);
     }
     int status = 0;
@@ -132,7 +132,8 @@ double MeasurePainting(const fs::path& source) {
     const HostObject command = application->Get("DoCmd").AsObject();
     const Stopwatch watch;
     for (const auto& [all, open, opened, type, view] :
-         {std::tuple{"AllForms", "OpenForm", "Forms", 2, 0}, std::tuple{"AllReports", "OpenReport", "Reports", 3, 2}}) {
+         {std::tuple{"AllForms", "OpenForm", "Forms", 2, 0},
+          std::tuple{"AllReports", "OpenReport", "Reports", 3, 2}}) {
         const HostObject objects = project->Get(all).AsObject();
         const int count = objects->Get("Count").AsInteger();
         for (int i = 0; i < count; ++i) {
@@ -159,14 +160,15 @@ void Measure(const char* name, const fs::path& source, const fs::path& work) {
     const double painting = MeasurePainting(source);
     const double floorSeconds = floor.writing + floor.encoding;
     const auto share = [&](double seconds) { return 100 * seconds / run.seconds; };
-    std::printf("%-14s run %7.2f s (processor %.2f s), peak %.0f MB, %zu files, %.1f MB, %zu pictures\n", name,
-                run.seconds, run.processorSeconds, run.peakMegabytes, floor.files,
+    std::printf("%-14s run %7.2f s (processor %.2f s), peak %.0f MB, %zu files, %.1f MB, %zu pictures\n",
+                name, run.seconds, run.processorSeconds, run.peakMegabytes, floor.files,
                 static_cast<double>(floor.bytes) / 1e6, floor.pictures);
-    std::printf("%-14s painting %.2f s (%.0f%%), JPEG %.2f s (%.0f%%), rendering and the rest %.2f s (%.0f%%)\n", "",
-                painting, share(painting), floor.encoding, share(floor.encoding),
-                run.seconds - painting - floor.encoding, share(run.seconds - painting - floor.encoding));
-    std::printf("%-14s floor %.2f s (writing %.2f s, encoding %.2f s): ratio %.1f\n", "", floorSeconds, floor.writing,
-                floor.encoding, run.seconds / floorSeconds);
+    std::printf(
+        "%-14s painting %.2f s (%.0f%%), JPEG %.2f s (%.0f%%), rendering and the rest %.2f s (%.0f%%)\n", "",
+        painting, share(painting), floor.encoding, share(floor.encoding),
+        run.seconds - painting - floor.encoding, share(run.seconds - painting - floor.encoding));
+    std::printf("%-14s floor %.2f s (writing %.2f s, encoding %.2f s): ratio %.1f\n", "", floorSeconds,
+                floor.writing, floor.encoding, run.seconds / floorSeconds);
     std::fflush(stdout);
 }
 

@@ -20,9 +20,9 @@ int RoundToEven(double value);
 /// Frame of the window around its client area.
 struct FrameInput {
     View view = View::Design;
-    int borderStyle = 2;           ///< 0 none, 1 thin, 2 sizable, 3 dialog
+    int borderStyle = 2; ///< 0 none, 1 thin, 2 sizable, 3 dialog
     bool recordSelectors = false;
-    bool rulerOn = false;          ///< design view shows its rulers
+    bool rulerOn = false; ///< design view shows its rulers
 };
 struct Frame {
     int frame = 0;
@@ -39,7 +39,7 @@ Frame ComputeFrame(const SystemMetrics& metrics, const FrameInput& input);
 /// Section numbers: 0 detail, 1 header, 2 footer, 3 page header, 4 page footer.
 /// A height of -503 or less, or none, means that the section is absent.
 struct SectionHeights {
-    std::array<int, 5> pixels{};    ///< 0 where absent
+    std::array<int, 5> pixels{}; ///< 0 where absent
     std::array<bool, 5> present{};
 };
 /// Order from the top: header, page header, detail, page footer, footer.
@@ -62,13 +62,14 @@ constexpr bool SectionIsShown(View view, int section, bool visible) {
 int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int section);
 
 /// A control's place, relative to the client area's origin (add the frame's client offset for the place
-/// in the window's picture). Twips in, pixels out. `sectionOffset` and `sectionBarHeight` are those of its section.
+/// in the window's picture). Twips in, pixels out. `sectionOffset` and `sectionBarHeight` are those of its
+/// section.
 Rectangle ControlRectangle(const SystemMetrics& metrics, const Frame& frame, int sectionOffset, double left,
                            double top, double width, double height);
 
 /// A tab control's tabs, in one row.
 struct TabInput {
-    int controlLeft = 0, controlTop = 0; ///< as ControlRectangle gave them
+    int controlLeft = 0, controlTop = 0;    ///< as ControlRectangle gave them
     double fixedWidth = 0, fixedHeight = 0; ///< twips, 0 for natural
     double fontSize = 8;
     int fontWeight = 400;
