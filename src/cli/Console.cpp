@@ -71,6 +71,7 @@ void PrintResult(const std::string& text) {
 ProgressLine::ProgressLine(bool verbose) : terminal_(isatty(STDERR_FILENO) != 0), verbose_(verbose) {}
 
 void ProgressLine::Phase(const std::string& text) {
+    bar_.clear();
     if (terminal_ && !verbose_)
         Draw(text);
     else
@@ -85,9 +86,15 @@ void ProgressLine::Object(const std::string& kind, const std::string& name, int 
         constexpr int kBar = 24;
         const int most = std::max(maximum, 1);
         const auto filled = static_cast<std::size_t>(kBar * std::min(position, most) / most);
-        Draw("[" + std::string(filled, '#') + std::string(kBar - filled, '-') + "] " +
-             std::to_string(position) + "/" + std::to_string(most) + " " + object);
+        bar_ = "[" + std::string(filled, '#') + std::string(kBar - filled, '-') + "] " +
+               std::to_string(position) + "/" + std::to_string(most) + " ";
+        Draw(bar_ + object);
     }
+}
+
+void ProgressLine::Detail(const std::string& text) {
+    if (terminal_ && !verbose_)
+        Draw(bar_ + text);
 }
 
 void ProgressLine::Draw(const std::string& text) {
@@ -124,10 +131,6 @@ int ConsoleMessageBoxes::Show(const std::string& text, std::uint32_t flags, cons
     if ((flags & kButtons) == kMsgOkCancel && warningsStop)
         return platform::kAnswerCancel;
     return platform::DefaultMessageBoxAnswer(flags);
-}
-
-void PhaseView::Begin(const std::string& message, std::int32_t) {
-    progress_.Phase(message);
 }
 
 } // namespace tovimar::cli

@@ -16,8 +16,8 @@ void PrintHint(const std::string& text);
 /// On standard output.
 void PrintResult(const std::string& text);
 
-/// On a terminal one line with a bar that is written over and over; elsewhere nothing but `Phase`, or with
-/// `verbose` a line per object.
+/// On a terminal one line with a bar that is written over and over; elsewhere a line per phase, and with
+/// `verbose` one per object.
 class ProgressLine {
 public:
     explicit ProgressLine(bool verbose);
@@ -27,6 +27,8 @@ public:
 
     void Phase(const std::string& text);
     void Object(const std::string& kind, const std::string& name, int position, int maximum);
+    /// What is done within a phase or an object: beside the bar, and only there.
+    void Detail(const std::string& text);
     /// Takes the line away before something else is printed.
     void Clear();
 
@@ -36,6 +38,7 @@ private:
     bool terminal_;
     bool verbose_;
     bool drawn_ = false;
+    std::string bar_;
 };
 
 /// Boxes nobody can answer: the text is printed, the default button answers, and what would leave the
@@ -55,12 +58,12 @@ private:
     bool verbose_;
 };
 
-/// The steps of the run as phases.
-class PhaseView : public platform::ProgressView {
+/// The progress window's messages, which change with every field of a table.
+class DetailView : public platform::ProgressView {
 public:
-    explicit PhaseView(ProgressLine& progress) : progress_(progress) {}
-    void Begin(const std::string& message, std::int32_t maximum) override;
-    void Update(const std::string&, std::int32_t) override {}
+    explicit DetailView(ProgressLine& progress) : progress_(progress) {}
+    void Begin(const std::string& message, std::int32_t) override { progress_.Detail(message); }
+    void Update(const std::string& message, std::int32_t) override { progress_.Detail(message); }
     void End() override {}
 
 private:

@@ -109,6 +109,7 @@ void Generation::Connect() {
     generator.NodeStarted = [this](const NodeProgress& node) {
         surroundings_.Progress().Object(node.kind, node.name, node.position, node.maximum);
     };
+    generator.CompilerStarted = [this] { surroundings_.Progress().Phase("Compiling help"); };
     RunData().LoadSettings();
     StopIfInterrupted();
 }
@@ -197,7 +198,9 @@ int Generation::Write() {
 }
 
 int Generation::Judge(CTovimarActions::Outcome outcome) {
-    if (platform::InterruptRequested())
+    if (outcome != CTovimarActions::Outcome::Cancelled)
+        StopIfInterrupted();
+    else if (platform::InterruptRequested())
         return kInterrupted;
     if (outcome != CTovimarActions::Outcome::Completed)
         return kFailed;

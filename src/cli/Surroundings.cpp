@@ -112,7 +112,7 @@ Surroundings::Surroundings(bool verbose) : progress_(verbose) {
     auto boxes = std::make_unique<ConsoleMessageBoxes>(progress_, verbose);
     boxes_ = boxes.get();
     environment->messageBoxes = std::move(boxes);
-    environment->progressWindow = std::make_unique<PhaseView>(progress_);
+    environment->progressWindow = std::make_unique<DetailView>(progress_);
     before_ = platform::SetEnvironment(std::move(environment));
 }
 

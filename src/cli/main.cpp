@@ -28,8 +28,10 @@ int Run(const Arguments& arguments) {
         }
     } catch (const std::exception& failure) {
         surroundings.Progress().Clear();
-        if (platform::InterruptRequested())
+        if (platform::InterruptRequested()) {
+            PrintError("interrupted");
             return kInterrupted;
+        }
         PrintError(NativePathsInText(failure.what()));
         return kFailed;
     }

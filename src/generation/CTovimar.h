@@ -87,6 +87,8 @@ public:
     std::function<void()> OpenHelpEditor;
     /// Called for every node of a pass before it is made.
     std::function<void(const NodeProgress&)> NodeStarted;
+    /// Called before the help compiler runs.
+    std::function<void()> CompilerStarted;
     /// What the help compiler of the last run printed, and its exit code; empty and 0 when it didn't run.
     std::string CompilerOutput;
     int CompilerExitCode = 0;

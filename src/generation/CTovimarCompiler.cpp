@@ -40,6 +40,9 @@ void RemoveLeavings(const CAddInProject& project) {
 void RunCompiler(const CAddInProject& project) {
     const std::string projectFile = platform::Join(project.Folder, project.Name + ".hhp");
     const std::string commandLine = "\"" + GetHtmlHelpWorkshopExePath() + "hhc.exe\" \"" + projectFile + "\"";
+    auto* generator = Session::Generator();
+    if (generator != nullptr && generator->CompilerStarted)
+        generator->CompilerStarted();
     platform::Processes::Outcome outcome;
     try {
         outcome = platform::Env().processes->RunAndWait(commandLine);
@@ -48,7 +51,7 @@ void RunCompiler(const CAddInProject& project) {
         throw;
     }
     Session::TraceLog()->addMessage("hhc.exe: " + outcome.output);
-    if (auto* generator = Session::Generator()) {
+    if (generator != nullptr) {
         generator->CompilerOutput = outcome.output;
         generator->CompilerExitCode = outcome.exitCode;
     }

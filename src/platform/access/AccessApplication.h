@@ -31,7 +31,7 @@ struct ApplicationSummary {
     std::string fullName; ///< Windows path of the database, see CurrentProject.FullName
     /// By kind in the order of ObjectKind, within a kind sorted without regard to case. No system tables.
     std::vector<ObjectSummary> objects;
-    /// Sentences for a person, such as "2 forms known by name only.".
+    /// Sentences for a person, such as how many forms are known by name only.
     std::vector<std::string> notes;
 };
 

@@ -53,7 +53,12 @@ void AddNote(const std::vector<ObjectSummary>& objects, ObjectKind kind, const c
         return std::to_string(count) + " " + (count == 1 ? singular : plural);
     };
     if (unknown > 0)
-        notes.push_back(noun(unknown) + " known by name only.");
+        notes.push_back(noun(unknown) +
+                        (unknown == 1 ? " is known by name only, because the database file doesn't give its "
+                                        "design; it gets no topic. Export it as text to document it."
+                                      : " are known by name only, because the database file doesn't give "
+                                        "their designs; they get no topics. Export them as text to document "
+                                        "them."));
     if (damaged > 0)
         notes.push_back(noun(damaged) + " can't be read.");
 }

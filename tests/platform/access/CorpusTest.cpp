@@ -89,7 +89,10 @@ TEST_F(CorpusTest, ReadsEveryDatabase) {
             EXPECT_EQ(object.error, "") << path << " " << object.name;
     }
     const auto forms = CorpusFolder() + "/access-forms/Controls.accdb";
-    EXPECT_EQ(SummarizeApplication(forms).notes, std::vector<std::string>{"29 forms known by name only."});
+    EXPECT_EQ(SummarizeApplication(forms).notes,
+              std::vector<std::string>{
+                  "29 forms are known by name only, because the database file doesn't give their designs; "
+                  "they get no topics. Export them as text to document them."});
     EXPECT_EQ(RaisedBy([&] { ApplicationModel(forms).OpenDesign(ObjectKind::Form, "frmProducts"); }).text,
               forms + ": of the form frmProducts only the name is known, its design isn't.");
     ApplicationModel queries(CorpusFolder() + "/databases/queryTestV1997.mdb");
