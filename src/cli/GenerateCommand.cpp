@@ -76,6 +76,7 @@ private:
 
     const Arguments& arguments_;
     Surroundings& surroundings_;
+    HostObject source_;
     CTovimarClient client_;
     CTovimarActions actions_;
     GenerationRequest request_;
@@ -84,7 +85,8 @@ private:
 /// Everything is read once before the first folder is made, so that bad input leaves nothing half-written.
 void Generation::CheckSource() {
     surroundings_.Progress().Phase("Reading " + arguments_.source);
-    const auto application = platform::access::SummarizeApplication(arguments_.source);
+    source_ = platform::access::OpenAccessApplication(arguments_.source);
+    const auto application = platform::access::SummarizeApplication(source_);
     StopIfInterrupted();
     surroundings_.Progress().Clear();
     std::size_t broken = 0;
@@ -101,9 +103,8 @@ void Generation::CheckSource() {
 }
 
 void Generation::Connect() {
-    const HostObject application = platform::access::OpenAccessApplication(arguments_.source);
     RegisterSettingsLoader();
-    if (client_.Connect(application) != kSuccess)
+    if (client_.Connect(source_) != kSuccess)
         throw Stop{"'" + FullPath(arguments_.source) + "' can't be opened"};
     auto& generator = RunData().Generator();
     generator.NodeStarted = [this](const NodeProgress& node) {

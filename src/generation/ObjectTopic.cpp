@@ -131,6 +131,7 @@ void ObjectTopic::Render() {
         form_->SetStylesheetFullPath(generator_.Parameters().CSSFullPath());
     if (form_->Charset.empty())
         form_->Charset = generator_.Parameters().Charset;
+    form_->HeldTopic = &topicText_;
     switch (type_) {
     case ObjectType::kForm:
         form_->SaveHTMLEx(topic_, /*HtmlOfReport=*/false);
@@ -166,6 +167,7 @@ void ObjectTopic::RenderWorksheet(const char* templateFile) {
 }
 
 void ObjectTopic::SaveDefinition() {
+    form_->HeldTopic = nullptr;
     const auto* project = Session::CurrentProject();
     const std::string folder = project->XmlFormsFolder();
     const std::string file = node_.XmlFormFileName();
@@ -177,7 +179,8 @@ void ObjectTopic::SaveDefinition() {
 
 void ObjectTopic::FinishPage() {
     clsHTMLFile page;
-    if (page.Load(topic_) != kSuccess)
+    const bool held = !topicText_.empty();
+    if ((held ? page.LoadText(topic_, std::move(topicText_)) : page.Load(topic_)) != kSuccess)
         return;
     const bool byCaption = generator_.Parameters().IdentifyControls == 0;
     SavePage(page, node_, StripAccelerators(byCaption ? form_->Text : form_->Name),

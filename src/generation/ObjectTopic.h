@@ -39,6 +39,7 @@ private:
     CHelpPrjTreeNode& node_;
     std::int32_t type_ = 0;
     std::string topic_;
+    std::string topicText_; ///< rendered, not yet written
     std::string picture_;
     std::shared_ptr<CXmlForm> form_;
     std::string savingDetail_;

@@ -136,12 +136,14 @@ bool CHelpPrjTreeNode::HasContentsEntry() const {
 
 void CHelpPrjTreeNode::AppendObjectChildren(std::string& out, std::int32_t level, ContentsStyle& style) {
     const bool running = Session::Run().generationInProgress;
-    // An unchanged topic doesn't cost a parse of its HTML on every build of the contents.
+    // An unchanged topic doesn't cost a parse of its HTML on every build of the contents. A generation has
+    // just written its topics, and counts them as changed even where the bytes came out as before: the second
+    // run into a folder gives what the first one gave.
     bool fileChanged = true;
     bool defsChanged = false;
     if (HelpPrjTree != nullptr) {
         if (const auto* checkSum = HelpPrjTree->GetCheckSumObject(GeneratedHTMLFileFullPath()))
-            fileChanged = checkSum->CheckSumChanged();
+            fileChanged = running || checkSum->CheckSumChanged();
         if (fileChanged)
             HelpPrjTree->MakeXmlFormControlDefs(*this, /*external=*/false, {}, defsChanged);
         if (defsChanged)

@@ -63,13 +63,19 @@ ResultCode clsHTMLFile::Load(const std::string& vstrFullPath) {
     const ResultCode failure = Trapped("clsHTMLFile", "Load", [&] {
         CUTF8FileReader reader;
         result = reader.LoadFile(fullPath_);
-        if (result != kSuccess)
-            return;
-        HTML = WithProjectTags(reader.Text());
+        if (result == kSuccess)
+            result = LoadText(fullPath_, reader.Text());
+    });
+    return failure != kSuccess ? failure : result;
+}
+
+ResultCode clsHTMLFile::LoadText(const std::string& vstrFullPath, std::string text) {
+    fullPath_ = vstrFullPath;
+    return Trapped("clsHTMLFile", "Load", [&] {
+        HTML = WithProjectTags(std::move(text));
         Read(HTML, "<title>", "</title>", Title);
         Read(HTML, "<h1>", "</h1>", Caption);
     });
-    return failure != kSuccess ? failure : result;
 }
 
 ResultCode clsHTMLFile::Save(const std::string& vstrFullPath) {

@@ -23,6 +23,8 @@ public:
     /// Reads the page, its title and its caption. 0; 0x80040001 for an empty path, 0x80040002 for a missing
     /// file, else the number of a reported failure.
     ResultCode Load(const std::string& vstrFullPath);
+    /// Takes the text that stands, or will stand, at a path.
+    ResultCode LoadText(const std::string& vstrFullPath, std::string text);
     /// Fills the page in and writes it; the path given or the last one. 0; 0x80040001 without a path; else
     /// the number of a reported failure, with the old file back in its place.
     ResultCode Save(const std::string& vstrFullPath = {});

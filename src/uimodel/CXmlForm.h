@@ -131,6 +131,9 @@ public:
 
     /// Renders the topic of a form or report, writes it unless the path is empty, gives 0 or the number of
     /// a reported failure, and reads the documented lists back.
+    /// While set, the SaveHTML operations put the topic's text here and leave the writing to the caller, who
+    /// has more to fill in.
+    std::string* HeldTopic = nullptr;
     ResultCode SaveHTMLEx(const std::string& htmlFileFullPath, bool HtmlOfReport,
                           bool vfApplyZoomFactor = false, bool vfUseLocalImagePath = true,
                           const std::string& vstrPicsDir = {});

@@ -92,9 +92,14 @@ ResultCode CXmlForm::SaveHTML4Worksheet(const std::string& htmlFileFullPath,
 ResultCode CXmlForm::Render(const char* operation, const Rendering& rendering) {
     ResultCode result = kSuccess;
     const ResultCode failure = Trapped("CXmlForm", operation, [&] {
-        const std::string topic = RenderText(rendering);
+        std::string topic = RenderText(rendering);
         if (rendering.path.empty())
             return;
+        if (HeldTopic != nullptr && ReadsBackAsWritten(topic)) {
+            result = MakeDefsFromText(topic, false);
+            *HeldTopic = std::move(topic);
+            return;
+        }
         result = CUTF8FileWriter().SaveFile(rendering.path, topic, /*vfAddUTF8FileHeader=*/false,
                                             /*vfSaveAsUsualTextFileIfNotUTF8=*/true);
         if (result != kSuccess)

@@ -154,4 +154,11 @@ HostObject OpenAccessApplication(const std::string& nativePath) {
     return application;
 }
 
+ApplicationSummary SummarizeApplication(const HostObject& application) {
+    const auto opened = std::dynamic_pointer_cast<ApplicationObject>(application);
+    if (!opened)
+        RaiseNoSuchMember("Application");
+    return SummarizeModel(opened->Session().Model());
+}
+
 } // namespace tovimar::platform::access

@@ -37,5 +37,7 @@ struct ApplicationSummary {
 
 /// Reads the designs of all forms and reports for their captions. Raises as OpenAccessApplication.
 ApplicationSummary SummarizeApplication(const std::string& nativePath);
+/// The same of an opened application; what was read stays with it.
+ApplicationSummary SummarizeApplication(const HostObject& application);
 
 } // namespace tovimar::platform::access

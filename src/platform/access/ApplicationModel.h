@@ -133,4 +133,8 @@ private:
     std::unordered_map<const void*, std::unordered_map<std::string, Value>> written_;
 };
 
+/// What the application holds, see AccessApplication.h.
+struct ApplicationSummary;
+ApplicationSummary SummarizeModel(ApplicationModel& model);
+
 } // namespace tovimar::platform::access

@@ -71,6 +71,10 @@ bool IsSystemTable(ObjectKind kind, const std::string& name) {
 
 ApplicationSummary SummarizeApplication(const std::string& nativePath) {
     ApplicationModel model(nativePath);
+    return SummarizeModel(model);
+}
+
+ApplicationSummary SummarizeModel(ApplicationModel& model) {
     ApplicationSummary summary;
     summary.fullName = model.FullName();
     summary.name = BaseNameOf(model.FullName());

@@ -58,6 +58,18 @@ void ReplaceFile(const std::string& nativePath, std::string_view bytes) {
     }
 }
 
+/// A file that isn't there yet replaces nothing, so it is written in place; one that fails half-way goes.
+void WriteNewFile(const std::string& nativePath, std::string_view bytes) {
+    NativeFile file(nativePath, O_WRONLY | O_CREAT | O_EXCL);
+    try {
+        file.WriteAll(bytes);
+        file.Close();
+    } catch (...) {
+        unlink(nativePath.c_str());
+        throw;
+    }
+}
+
 void SortIgnoringCase(std::vector<std::string>& names) {
     std::sort(names.begin(), names.end(), [](const std::string& left, const std::string& right) {
         const int order = text::CompareIgnoringCase(left, right);
@@ -99,10 +111,15 @@ std::string DiskFileSystem::ReadFile(const std::string& path) {
 
 void DiskFileSystem::WriteFile(const std::string& path, std::string_view bytes) {
     const std::string native = Resolve(path);
-    if (KindOf(native) == Kind::Folder)
+    const Kind kind = KindOf(native);
+    if (kind == Kind::Folder)
         RaiseFileNumber(kPathAccessError, native);
-    RaiseIfReadOnly(native);
-    ReplaceFile(native, bytes);
+    if (kind == Kind::Missing && !fs::is_symlink(fs::path(native))) {
+        WriteNewFile(native, bytes);
+    } else {
+        RaiseIfReadOnly(native);
+        ReplaceFile(native, bytes);
+    }
     NoteEntry(native, true);
 }
 
