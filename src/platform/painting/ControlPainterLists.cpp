@@ -8,7 +8,6 @@
 
 namespace tovimar::platform::painting {
 
-using access::DesignObject;
 
 namespace {
 
