@@ -8,7 +8,6 @@
 
 namespace tovimar::platform::painting {
 
-
 namespace {
 
 /// Columns without a width of their own share what the others leave, at least an inch each.
