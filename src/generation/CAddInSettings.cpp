@@ -1,5 +1,6 @@
 #include "generation/CAddInSettings.h"
 
+#include "foundation/CAddInProject.h"
 #include "foundation/CAddInSettingsXmlFile.h"
 #include "foundation/CCodePages.h"
 #include "foundation/CTraceLog.h"
@@ -9,6 +10,7 @@
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimarParameters.h"
 #include "platform/Environment.h"
+#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
 #include <cstdlib>
@@ -57,6 +59,15 @@ void LoadCharset(Parameters& parameters, const Value& value) {
         parameters.Charset = platform::Env().languageId == kRussian ? "windows-1251" : "windows-1252";
 }
 
+/// A style sheet of the project's folder is stored by its name, so that the project can be moved.
+std::string StoredStyleSheet(const std::string& path) {
+    const auto* project = Session::CurrentProject();
+    const bool inProject =
+        project != nullptr &&
+        text::EqualsIgnoringCase(platform::FolderOf(path), platform::WithTrailingBackslash(project->Folder));
+    return inProject ? platform::FileNameOf(path) : path;
+}
+
 std::string OrElse(const Value& value, const std::string& fallback) {
     const std::string text = value.AsString();
     return text.empty() ? fallback : text;
@@ -103,7 +114,7 @@ const std::vector<Option>& Options() {
          Rule{LoadCharset, [](const Parameters& p) { return Value(p.Charset); }}},
         {{"CSSFullPath", "style sheet of the pages; a name alone is looked for among the templates", ""},
          Rule{[](Parameters& p, const Value& v) { p.SetCSSFullPath(v.AsString()); },
-              [](const Parameters& p) { return Value(p.CSSFullPath()); }}},
+              [](const Parameters& p) { return Value(StoredStyleSheet(p.CSSFullPath())); }}},
         {{"AddControlsListForMenuList", "menu topics list their items", kBoolean}, &Parameters::AddControlsListForMenuList},
         {{"AddControlsSectionForMenuList", "menu topics have a section per item", kBoolean},
          &Parameters::AddControlsSectionForMenuList},

@@ -85,7 +85,7 @@ public:
     /// Shows the help editor on the tree; none in a program without windows, which then asks nothing about
     /// it.
     std::function<void()> OpenHelpEditor;
-    /// Called for every node of a pass before it is made.
+    /// Called for every node of a pass before it is made; not for placeholders, which make nothing.
     std::function<void(const NodeProgress&)> NodeStarted;
     /// Called before the help compiler runs.
     std::function<void()> CompilerStarted;

@@ -256,6 +256,10 @@ void CTovimarActions::LoadTree() {
     parameters.NoReportsScreenShots = !parameters.AddImageForReport;
     Session::CurrentProject()->Folder = parameters.LastUsedFolderForGeneratedHelp;
 
+    // The web help's entry page is written last; one of an earlier run would count among the pages.
+    const std::string entryPage = parameters.FolderForGeneratedHelp() + "main.htm";
+    if (!earlierProjectFile_.empty() && FileExists(entryPage))
+        platform::Env().files->DeleteFile(entryPage);
     generator.UnLoadTreviewForActiveProject();
     generator.LoadTreviewForActiveProject(/*vfSkipIfLoaded=*/true);
     auto* root = generator.HelpProjectTree().Root();

@@ -74,7 +74,7 @@ void ShowNode(const CHelpPrjTreeNode& node, std::int32_t level, Walk& walk) {
     ++walk.counter;
     HostAgent().ProgressMeterInit(MeterText(node, level), walk.maxNodes);
     HostAgent().ProgressMeterUpdate(walk.counter);
-    if (!walk.generator.NodeStarted)
+    if (!walk.generator.NodeStarted || node.HasSerializer())
         return;
     const std::string kind = node.NodeComponentTypeName();
     walk.generator.NodeStarted(

@@ -145,6 +145,10 @@ TEST_F(SettingsTest, EveryOptionComesBackFromTheStore) {
          Option("HelpProjectName", "kept"));
     Parameters().AddHotSpotsForForm = true;
     file.CopyToOptions();
+    EXPECT_EQ(Value("C:\\a.css"), file.OptionValue("CSSFullPath"));
+    Parameters().SetCSSFullPath("own.css");
+    file.CopyToOptions();
+    EXPECT_EQ(Value("own.css"), file.OptionValue("CSSFullPath")) << "the project may be moved";
     EXPECT_EQ(Value("Name"), file.OptionValue("IdentifyBy"));
     EXPECT_EQ(Value("Jpeg"), file.OptionValue("SnapshotFormat"));
     EXPECT_EQ(Value(true), file.OptionValue("AddHotSpotsForForm"));
