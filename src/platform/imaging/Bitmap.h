@@ -17,12 +17,14 @@ template <typename T> struct UninitializedAllocator : std::allocator<T> {
     }
 };
 
+using Pixels = std::vector<std::uint32_t, UninitializedAllocator<std::uint32_t>>;
+
 /// A captured picture: 32-bit pixels 0x00RRGGBB, rows from the top, no padding.
 struct Bitmap {
     int width = 0;
     int height = 0;
     /// A resize leaves new pixels unset.
-    std::vector<std::uint32_t, UninitializedAllocator<std::uint32_t>> pixels;
+    Pixels pixels;
 
     bool Empty() const { return width <= 0 || height <= 0; }
 };

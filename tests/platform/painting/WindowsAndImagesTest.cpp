@@ -39,9 +39,8 @@ TEST(Windows, CapturesCutFromOnePainting) {
     auto* window = made.get();
     const auto handle = windows.Open(std::move(made));
     EXPECT_EQ(windows.Capture(handle, false, 0, 0, 2, 2).pixels, FourPixels().pixels);
-    EXPECT_EQ(windows.Capture(handle, true, 0, 0, 1, 1).pixels, std::vector<std::uint32_t>{0xFFFFFF});
-    EXPECT_EQ(windows.Capture(handle, false, 1, -1, 2, 2).pixels,
-              (std::vector<std::uint32_t>{0, 0, 0x00FF00, 0}))
+    EXPECT_EQ(windows.Capture(handle, true, 0, 0, 1, 1).pixels, Pixels{0xFFFFFF});
+    EXPECT_EQ(windows.Capture(handle, false, 1, -1, 2, 2).pixels, (Pixels{0, 0, 0x00FF00, 0}))
         << "black outside";
     EXPECT_EQ(window->painted, 1);
     windows.Invalidate(handle);
@@ -82,7 +81,7 @@ TEST(Images, ABitmapFileHasPaddedRowsFromTheBottom) {
 
 TEST(Images, WhatWasWrittenIsReadBack) {
     const auto bytes = EncodeBmp(FourPixels());
-    const std::vector<std::uint32_t> opaque{0xFFFF0000U, 0xFF00FF00U, 0xFF0000FFU, 0xFFFFFFFFU};
+    const Pixels opaque{0xFFFF0000U, 0xFF00FF00U, 0xFF0000FFU, 0xFFFFFFFFU};
     const auto file = DecodeImage(bytes);
     ASSERT_TRUE(file);
     EXPECT_EQ(file->pixels, opaque);
