@@ -87,8 +87,8 @@ std::string ControlText(const CFormHTMLControlDef& entry) {
 std::string CHelpPrjTreeNode::ContentsLink() const {
     auto link = GeneratedHTMLFile();
     if (IsControl || IsMenu)
-        link += '#' + GetComponentFileName(Parent ? Parent->Name() : platform::BaseNameOf(XmlFormFileName()),
-                                           Name());
+        link += '#' +
+                GetComponentAnchor(Parent ? Parent->Name() : platform::BaseNameOf(XmlFormFileName()), Name());
     return text::ReplaceAll(link, "\"", "&quot;");
 }
 
@@ -198,7 +198,7 @@ std::unordered_set<std::string> CHelpPrjTreeNode::AppendControls(std::string& ou
     std::unordered_set<std::string> listed;
     for (const auto* entries : {&form.DocumentedMenus, &form.DocumentedControls})
         for (const auto& entry : *entries) {
-            const auto link = GeneratedHTMLFile() + '#' + GetComponentFileName(form.Name, entry->ControlName);
+            const auto link = GeneratedHTMLFile() + '#' + GetComponentAnchor(form.Name, entry->ControlName);
             style.AppendEntry(out, level, link, ControlText(*entry));
             listed.insert(text::FoldCase(entry->ControlName));
         }

@@ -9,8 +9,7 @@ namespace tovimar {
 
 namespace {
 
-/// Bytes of a name: a file name holds 255 with prefix and extension. A control's name has more room, since
-/// it is an anchor first and has to be the one that the topic holds.
+/// Bytes of a name: a file name holds 255 with prefix and extension.
 constexpr std::size_t kLongestObject = 150;
 constexpr std::size_t kLongestControl = 220;
 
@@ -43,6 +42,10 @@ std::string GetComponentFileName(const std::string& vstrObjName, const std::stri
     if (!vstrCtlName.empty())
         name += '_' + vstrCtlName;
     return Shortened(NormalizeName(name), vstrCtlName.empty() ? kLongestObject : kLongestControl);
+}
+
+std::string GetComponentAnchor(const std::string& objectName, const std::string& controlName) {
+    return NormalizeName(objectName + '_' + controlName);
 }
 
 } // namespace tovimar

@@ -99,7 +99,7 @@ void clsHHK::AddControlLinks(const CXmlForm& form, const Source& source, const s
                              const std::string& file) {
     const auto caption =
         TruncateCaption(IdentifiedByName() ? source.name : text::ReplaceAll(source.caption, "&", ""));
-    const auto bookmark = GetComponentFileName(form.Name, source.name);
+    const auto bookmark = GetComponentAnchor(form.Name, source.name);
     for (const auto& word : KeywordsOf(source.indexes)) {
         // A keyword that only repeats the control's own caption is of use with the form's beside it.
         const bool repeats = text::EqualsIgnoringCase(word, caption);

@@ -9,6 +9,7 @@
 #include "uimodel/CXmlForm.h"
 #include "uimodel/SaturatedSum.h"
 
+#include <algorithm>
 #include <array>
 
 namespace tovimar {
@@ -41,6 +42,14 @@ Corners CornersInControlPicture(const CXmlForm& form, const CXmlControl& control
             SaturatedSum(control.HotSpotRight(), left), SaturatedSum(control.HotSpotBottom(), top)};
 }
 
+/// A subform shows a part of its form only: what its frame cuts is cut, what it hides is left empty.
+Corners WithinFrame(Corners corners, const CXmlControl& subform) {
+    const std::int32_t width = SaturatedSum(subform.HotSpotRight(), -std::int64_t{subform.HotSpotLeft()});
+    const std::int32_t height = SaturatedSum(subform.HotSpotBottom(), -std::int64_t{subform.HotSpotTop()});
+    return {std::max(corners[0], 0), std::max(corners[1], 0), std::min(corners[2], width),
+            std::min(corners[3], height)};
+}
+
 } // namespace
 
 void TopicSections::AppendArea(std::string& out, const std::string& prefix, const CXmlForm& form,
@@ -54,6 +63,11 @@ void TopicSections::AppendArea(std::string& out, const std::string& prefix, cons
                    control.HotSpotBottom()};
     else
         corners = CornersInControlPicture(form, control, *parent);
+    if (!ofTab && parent != nullptr && parent->IsClass("SubForm")) {
+        corners = WithinFrame(corners, *parent);
+        if (corners[0] >= corners[2] || corners[1] >= corners[3])
+            return;
+    }
     out.append("<AREA SHAPE=\"RECT\" COORDS=\"");
     for (std::size_t i = 0; i < corners.size(); ++i)
         out.append(i == 0 ? "" : ",").append(std::to_string(corners[i]));
@@ -102,8 +116,10 @@ void TopicSections::AppendMapOfControl(std::string& out, const CXmlControl& cont
     out.append(kMapOpening).append(Anchor(control)).append("\"> \r\n");
     for (const auto& child : control.Controls)
         if (!child->IsLabel()) {
+            const std::size_t before = out.size();
             AppendArea(out, prefix_, form_, *child, &control, false);
-            out.append("\r\n");
+            if (out.size() > before)
+                out.append("\r\n");
         }
     out.append(kMapClosing);
 }
