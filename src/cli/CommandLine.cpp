@@ -14,7 +14,10 @@ constexpr const char* kSource =
 
 void AddGenerate(CLI::App& app, Arguments& parsed, std::vector<std::string>& options, bool& noCompile) {
     auto* generate = app.add_subcommand("generate", "write the help of an application");
-    generate->add_option("SOURCE", parsed.source, kSource)->required();
+    generate->add_option("SOURCE", parsed.source, kSource)
+        ->required()
+        ->check(CLI::ExistingPath)
+        ->type_name("");
     generate
         ->add_option("--output", parsed.output,
                      "folder of the help project; \"NAME-help\" here when not given")
@@ -35,7 +38,7 @@ void AddGenerate(CLI::App& app, Arguments& parsed, std::vector<std::string>& opt
 
 void AddList(CLI::App& app, Arguments& parsed) {
     auto* list = app.add_subcommand("list", "show the objects of an application by kind, with captions");
-    list->add_option("SOURCE", parsed.source, kSource)->required();
+    list->add_option("SOURCE", parsed.source, kSource)->required()->check(CLI::ExistingPath)->type_name("");
     list->callback([&] { parsed.command = Arguments::Command::List; });
 }
 

@@ -29,11 +29,14 @@ std::string Printable(const std::string& text) {
 }
 
 void Print(std::FILE* stream, const char* prefix, const std::string& text) {
-    std::string lines = Printable(text);
-    lines.erase(lines.find_last_not_of(" \n") + 1);
-    if (*prefix != '\0')
-        lines = text::ReplaceAll(lines, "\n", "\n  ");
-    std::fprintf(stream, "%s%s\n", prefix, lines.c_str());
+    std::string shown = Printable(text);
+    shown.erase(shown.find_last_not_of(" \n") + 1);
+    const std::string indent = *prefix == '\0' ? "" : "  ";
+    std::string lead = prefix;
+    for (const std::string& line : text::Split(shown, "\n")) {
+        std::fprintf(stream, "%s%s\n", line.empty() ? "" : lead.c_str(), line.c_str());
+        lead = indent;
+    }
     std::fflush(stream);
 }
 

@@ -21,6 +21,8 @@ void OnSignal(int number) {
 void InstallInterruptHandler() {
     struct sigaction action {};
     action.sa_handler = OnSignal;
+    // Output that waits for its reader goes on; the run looks at the flag itself.
+    action.sa_flags = SA_RESTART;
     sigemptyset(&action.sa_mask);
     sigaction(SIGINT, &action, nullptr);
     sigaction(SIGTERM, &action, nullptr);
