@@ -72,7 +72,10 @@ void TopicSections::AppendArea(std::string& out, const std::string& prefix, cons
     for (std::size_t i = 0; i < corners.size(); ++i)
         out.append(i == 0 ? "" : ",").append(std::to_string(corners[i]));
     out.append("\" HREF=\"#").append(prefix).append("_").append(ControlBookmark(control));
-    out.append("\" FRAME=\"\" alt=\"").append(control.Caption()).append("\" />");
+    // The text goes in as it stands, but for what would end the attribute or upset a compiler's reader.
+    const std::string alt =
+        text::ReplaceAll(text::ReplaceAll(control.Caption(), "\"", "&quot;"), "<", "&lt;");
+    out.append("\" FRAME=\"\" alt=\"").append(alt).append("\" />");
 }
 
 void TopicSections::AppendMap(std::string& out) const {

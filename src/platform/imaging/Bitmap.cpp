@@ -31,7 +31,7 @@ Bitmap BlackBitmap(int width, int height) {
     Bitmap bitmap;
     bitmap.width = std::clamp(width, 0, kLargestSide);
     bitmap.height = std::clamp(height, 0, std::min(kLargestSide, kMostPixels / std::max(1, bitmap.width)));
-    bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height));
+    bitmap.pixels.assign(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height), 0);
     return bitmap;
 }
 

@@ -31,7 +31,7 @@ Image Sized(int width, int height) {
     Image image;
     image.width = width;
     image.height = height;
-    image.pixels.resize(static_cast<std::size_t>(width) * static_cast<std::size_t>(height));
+    image.pixels.assign(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), 0);
     return image;
 }
 

@@ -42,7 +42,7 @@ Size DesignSize(const OpenObject& object, const SystemMetrics& metrics) {
     const auto sections = object.design->Sections();
     double height = kDesignMarginY;
     for (const auto& section : sections)
-        height += std::max(0, section.object->Integer("Height", 0)) + kDesignBar;
+        height += static_cast<double>(std::max(0, section.object->Integer("Height", 0))) + kDesignBar;
     // A bar takes a little more room than the host counts for it.
     const int bars =
         static_cast<int>(sections.size()) * (ComputeFrame(metrics, object.FrameSettings()).sectionBarHeight -
