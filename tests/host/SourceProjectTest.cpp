@@ -122,7 +122,7 @@ TEST_F(SourceProjectTest, OnlyWhatIsAskedFor) {
     EXPECT_TRUE(Session::ServerAgent()->ParseSourceProject()->Forms().Empty());
     EXPECT_TRUE(copies.empty());
     CHelpPrjSourceProject other;
-    EXPECT_EQ(other.Init("VB6", "C:\\x.vbp"), kFailure1);
+    EXPECT_EQ(other.Init("Pascal", "C:\\x.dpr"), kFailure1);
     EXPECT_FALSE(other.IsValid());
     EXPECT_TRUE(other.Forms().Empty());
     other.Terminate();

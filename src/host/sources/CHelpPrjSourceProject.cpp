@@ -1,15 +1,32 @@
 #include "host/sources/CHelpPrjSourceProject.h"
 
 #include "host/sources/CHelpPrjSourceItem.h"
+#include "host/sources/CSourceProjectAspNet.h"
+#include "host/sources/CSourceProjectCPP.h"
+#include "host/sources/CSourceProjectCS.h"
+#include "host/sources/CSourceProjectJS.h"
 #include "host/sources/CSourceProjectMSAccess.h"
+#include "host/sources/CSourceProjectMSExcel.h"
+#include "host/sources/CSourceProjectVB6.h"
+#include "host/sources/CSourceProjectVBNet.h"
 
-#include <vector>
+#include <array>
 
 namespace tovimar {
 namespace {
 
 const SourceItems kNoItems;
 const KeyedList<std::unique_ptr<IHelpPrjSourceProject>> kNoProjects;
+
+template <typename Project> std::unique_ptr<IHelpPrjSourceProject> Make() {
+    return std::make_unique<Project>();
+}
+
+/// In the order in which they are tried.
+constexpr std::array kMakers{Make<CSourceProjectAspNet>, Make<CSourceProjectMSAccess>,
+                             Make<CSourceProjectVB6>,    Make<CSourceProjectVBNet>,
+                             Make<CSourceProjectCS>,     Make<CSourceProjectJS>,
+                             Make<CSourceProjectCPP>,    Make<CSourceProjectMSExcel>};
 
 } // namespace
 
@@ -19,11 +36,14 @@ CHelpPrjSourceProject::~CHelpPrjSourceProject() = default;
 ResultCode CHelpPrjSourceProject::Init(const std::string& vstrHostAppTypeName,
                                        const std::string& vstrProjectFileFullPath) {
     project_.reset();
-    auto access = std::make_unique<CSourceProjectMSAccess>();
-    if (access->Init(vstrHostAppTypeName, vstrProjectFileFullPath) != kSuccess)
-        return kFailure1;
-    project_ = std::move(access);
-    return kSuccess;
+    for (const auto make : kMakers) {
+        auto project = make();
+        if (project->Init(vstrHostAppTypeName, vstrProjectFileFullPath) != kSuccess)
+            continue;
+        project_ = std::move(project);
+        return kSuccess;
+    }
+    return kFailure1;
 }
 
 void CHelpPrjSourceProject::Terminate() {

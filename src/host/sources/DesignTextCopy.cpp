@@ -1,49 +1,15 @@
 #include "host/sources/DesignTextCopy.h"
 
+#include "host/sources/TextLines.h"
 #include "platform/text/Text.h"
 
 namespace tovimar {
 namespace {
 
-/// One line after the other, trimmed, without copying the text.
-class Lines {
-public:
-    explicit Lines(std::string_view text) : rest_(text) {}
-
-    bool Next(std::string_view& line) {
-        if (rest_.empty())
-            return false;
-        line = Trimmed(rest_.substr(0, rest_.find('\n')));
-        DropLine();
-        return true;
-    }
-
-    /// The next line when it goes on with the quoted text of the line before.
-    bool NextOfQuotedText(std::string_view& line) {
-        const std::string_view next = Trimmed(rest_.substr(0, rest_.find('\n')));
-        if (next.size() < 2 || next.front() != '"')
-            return false;
-        line = next;
-        DropLine();
-        return true;
-    }
-
-private:
-    static std::string_view Trimmed(std::string_view line) {
-        constexpr std::string_view kWhite = " \t\r";
-        const auto first = line.find_first_not_of(kWhite);
-        if (first == std::string_view::npos)
-            return {};
-        return line.substr(first, line.find_last_not_of(kWhite) - first + 1);
-    }
-
-    void DropLine() {
-        const auto end = rest_.find('\n');
-        rest_ = end == std::string_view::npos ? std::string_view() : rest_.substr(end + 1);
-    }
-
-    std::string_view rest_;
-};
+/// A quoted text goes on in quotes on the lines below.
+bool ContinuesQuotedText(std::string_view line) {
+    return line.size() >= 2 && line.front() == '"';
+}
 
 /// The sign behind a backslash: three octal digits stand for a character, anything else for itself.
 std::string Unescaped(std::string_view quoted) {
@@ -67,14 +33,14 @@ std::string Unescaped(std::string_view quoted) {
 
 /// From behind the first double quote up to the last character, which closes it; a long text goes on in
 /// quotes on the lines below.
-std::string QuotedValue(std::string_view line, Lines& lines) {
+std::string QuotedValue(std::string_view line, TextLines& lines) {
     std::string value;
     do {
         const auto open = line.find('"');
         if (open == std::string_view::npos || open + 1 >= line.size())
             break;
         value += Unescaped(line.substr(open + 1, line.size() - open - 2));
-    } while (lines.NextOfQuotedText(line));
+    } while (lines.NextIf(line, ContinuesQuotedText));
     return text::TrimWhitespace(value);
 }
 
@@ -86,7 +52,7 @@ bool IsProperty(std::string_view line, std::string_view name) {
     return next != std::string_view::npos && line[next] == '=';
 }
 
-bool SkipToObject(Lines& lines, const std::string& start) {
+bool SkipToObject(TextLines& lines, const std::string& start) {
     std::string_view line;
     while (lines.Next(line))
         if (text::StartsWithIgnoringCase(line, start))
@@ -98,7 +64,7 @@ bool SkipToObject(Lines& lines, const std::string& start) {
 
 DesignTextCopy ParseDesignTextCopy(std::string_view text, std::string_view typeWord) {
     DesignTextCopy copy;
-    Lines lines(text);
+    TextLines lines(text);
     if (!SkipToObject(lines, "Begin " + std::string(typeWord)))
         return copy;
     const std::string prefix = std::string(typeWord) + ".";
@@ -109,7 +75,7 @@ DesignTextCopy ParseDesignTextCopy(std::string_view text, std::string_view typeW
             nested = true;
         } else if (!nested && IsProperty(line, "Caption")) {
             copy.caption = QuotedValue(line, lines);
-        } else if (nested && IsProperty(line, "SourceObject")) {
+        } else if (nested && !typeWord.empty() && IsProperty(line, "SourceObject")) {
             const std::string source = QuotedValue(line, lines);
             if (text::StartsWithIgnoringCase(source, prefix) && source.size() > prefix.size())
                 copy.subforms.push_back(source.substr(prefix.size()));

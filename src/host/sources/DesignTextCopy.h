@@ -13,7 +13,8 @@ struct DesignTextCopy {
     std::vector<std::string> subforms;
 };
 
-/// Reads the text up to the code behind the design. `typeWord` is "Form" or "Report".
+/// Reads the text up to the code behind the design. `typeWord` is "Form" or "Report"; without
+/// one any object begins the design, and only its caption is read.
 DesignTextCopy ParseDesignTextCopy(std::string_view text, std::string_view typeWord);
 
 } // namespace tovimar

@@ -1,0 +1,2 @@
+<%@ Page Language="c#" %>
+<form runat="server" this.Name = "x"></form>

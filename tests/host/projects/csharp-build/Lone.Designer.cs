@@ -1,0 +1,7 @@
+partial class Lone
+{
+    void InitializeComponent()
+    {
+        this.Text = "Alone";
+    }
+}

@@ -1,0 +1,6 @@
+namespace Store.Views
+{
+    partial class Grid
+    {
+    }
+}

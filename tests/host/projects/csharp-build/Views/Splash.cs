@@ -1,0 +1,6 @@
+namespace Store.Views
+{
+    public class Splash : System.Windows.Forms.Form
+    {
+    }
+}

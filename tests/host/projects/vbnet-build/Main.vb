@@ -1,0 +1,2 @@
+Public Class Main
+End Class

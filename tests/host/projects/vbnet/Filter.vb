@@ -1,0 +1,3 @@
+Public Class Filter
+    Inherits System.Windows.Forms.UserControl
+End Class
