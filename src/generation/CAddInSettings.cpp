@@ -52,6 +52,15 @@ void LoadHeadingLevel(Parameters& parameters, const Value& value) {
     parameters.MSWordTOCLowerHeadingLevel = level < 1 || level > 9 ? 2 : level;
 }
 
+std::string ScaleWord(double scale) {
+    return scale == 2 ? "2" : scale == 1.5 ? "1.5" : "1";
+}
+
+void LoadScale(Parameters& parameters, const Value& value) {
+    const std::string word = text::Trim(value.AsString());
+    parameters.ImagesScale = word == "2" ? 2 : word == "1.5" ? 1.5 : 1;
+}
+
 void LoadCharset(Parameters& parameters, const Value& value) {
     constexpr int kRussian = 1049;
     parameters.Charset = value.AsString();
@@ -89,6 +98,8 @@ const std::vector<Option>& Options() {
         {{"SnapshotFormat", "format of the pictures", "Bitmap|Jpeg"},
          Rule{[](Parameters& p, const Value& v) { p.ImagesFormat = v.AsString() == "Bitmap" ? 1 : 2; },
               [](const Parameters& p) { return Value(p.ImagesFormat == 1 ? "Bitmap" : "Jpeg"); }}},
+        {{"SnapshotScale", "size of the pictures' pixels; at 1.5 and 2 they are sharp on screens of high resolution", "1|1.5|2"},
+         Rule{LoadScale, [](const Parameters& p) { return Value(ScaleWord(p.ImagesScale)); }}},
         {{"BulletedControlsAndMenus", "lists of controls and menus have bullets", kBoolean}, &Parameters::BulletMenusControls},
         {{"AddHotSpots", "definitions carry an image map", kBoolean}, &Parameters::HotSpots},
         {{"AssociateHelpIndex", "the compiled help has an index", kBoolean}, &Parameters::AssociateHelpIndex},

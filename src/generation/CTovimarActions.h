@@ -2,12 +2,15 @@
 
 #include "platform/Error.h"
 
+#include <cstdint>
+#include <memory>
 #include <string>
 
 namespace tovimar {
 
 class CAddInProject;
 class CTovimarStats;
+class clsScreenshotOptions;
 
 /// What a caller of a generation decides beside the options. Empty fields take the source project's.
 struct GenerationRequest {
@@ -21,6 +24,9 @@ struct GenerationRequest {
 /// a wizard: the options stand in the parameters, nobody is asked for them.
 class CTovimarActions {
 public:
+    CTovimarActions();
+    ~CTovimarActions();
+
     /// Why a generation can't start; 0 means it can.
     static constexpr ResultCode kOtherFolder = MakeResultCode(0x80040065U);
     static constexpr ResultCode kNameTaken = MakeResultCode(0x80040066U);
@@ -40,6 +46,16 @@ public:
     /// in the run's error count, also behind a completed run.
     Outcome GenerateFromOptions();
 
+    /// What the user chose for retaken pictures; taken from the settings at the first read.
+    clsScreenshotOptions& ScreenshotOptions();
+    void GetScreenshotOptions();
+    /// Retakes the picture of the active object; asks for the options first where they say so. True when a
+    /// picture was taken.
+    bool TakeScreenshotAction();
+    /// Of an open form or report, into the places of the options. A topic is backed up first. False after a
+    /// warning.
+    bool TakeScreenshot(std::int32_t type, const std::string& name);
+
     /// What a run made, in lines, for a kind of source project.
     static std::string SummaryText(const CTovimarStats& stats, const std::string& sourceProjectTypeName);
 
@@ -49,6 +65,7 @@ private:
     void LoadTree();
     Outcome RunGeneration();
 
+    std::unique_ptr<clsScreenshotOptions> screenshotOptions_;
     /// Project file that is made anew, in the folder of the help project.
     std::string earlierProjectFile_;
 };

@@ -42,6 +42,7 @@ public:
     bool HotSpots = false;             ///< option `AddHotSpots`
     std::int32_t IdentifyControls = 0; ///< 0 by caption, 1 by name; option `IdentifyBy`
     std::int32_t ImagesFormat = 0;     ///< 1 bitmap, else JPEG; option `SnapshotFormat`
+    double ImagesScale = 1;            ///< pixels of a picture per pixel shown; option `SnapshotScale`
     bool BulletMenusControls = false;  ///< option `BulletedControlsAndMenus`
     std::string Website;
     std::string Copyright;

@@ -20,6 +20,7 @@
 #include "host/server/CXmlCommand.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
+#include "platform/imaging/PictureSize.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
@@ -28,6 +29,7 @@
 #include "uimodel/CClientUIObjectXml.h"
 #include "uimodel/CXmlForm.h"
 
+#include <cmath>
 #include <optional>
 
 namespace tovimar {
@@ -90,6 +92,22 @@ void ExtractSavedIds(const CHelpPrjTreeNode& node, CTovimar& generator) {
         generator.HelpContextIds().ExtractUsedHelpContextIds(*form);
 }
 
+/// A picture with more pixels than it is shown with says how large that is.
+std::string ShownSize(const std::string& picture, const CTovimarParameters& parameters) {
+    std::string result;
+    if (parameters.ImagesScale == 1)
+        return result;
+    PassOver([&] {
+        if (const auto size = platform::PictureSize(platform::Env().files->ReadFile(picture))) {
+            const auto shown = [&](int pixels) {
+                return std::to_string(std::lround(pixels / parameters.ImagesScale));
+            };
+            result = "WIDTH=\"" + shown(size->first) + "\" HEIGHT=\"" + shown(size->second) + "\" ";
+        }
+    });
+    return result;
+}
+
 /// A database without relations has no page of them.
 Tags DatamodelTags(CHelpPrjTreeNode& node, const CTovimarParameters& parameters) {
     if (!text::EqualsIgnoringCase(node.Tag, "Datamodel"))
@@ -99,8 +117,9 @@ Tags DatamodelTags(CHelpPrjTreeNode& node, const CTovimarParameters& parameters)
         node.SetSkipped(true);
         return {};
     }
-    return {"{{DatamodelImage}}|<IMG SRC=\"" + parameters.NameOfFolderForGeneratedImagesWithSlash() +
-                "Datamodel" + parameters.ImagesFileExt() + "\" BORDER=0 />",
+    const std::string file = "Datamodel" + parameters.ImagesFileExt();
+    return {"{{DatamodelImage}}|<IMG SRC=\"" + parameters.NameOfFolderForGeneratedImagesWithSlash() + file +
+                "\" BORDER=0 " + ShownSize(parameters.FolderForGeneratedImages() + file, parameters) + "/>",
             "{{Relationships}}|" + relations};
 }
 

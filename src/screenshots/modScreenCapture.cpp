@@ -3,6 +3,7 @@
 #include "foundation/CTraceLog.h"
 #include "foundation/ErrorTrap.h"
 #include "foundation/Session.h"
+#include "generation/CTovimarParameters.h"
 #include "platform/Environment.h"
 #include "platform/imaging/Jpeg.h"
 #include "platform/text/Text.h"
@@ -20,6 +21,11 @@ constexpr int kBestQuality = 100;
 
 using capture_trace::Line;
 using capture_trace::Yes;
+
+double Scale() {
+    const auto* parameters = Session::Parameters();
+    return parameters == nullptr ? 1 : parameters->ImagesScale;
+}
 
 /// The steps that a capture has on a display without a palette.
 void TraceCapture(platform::WindowHandle window, bool captured) {
@@ -58,7 +64,8 @@ Picture CaptureWindow(platform::WindowHandle hWndSrc, bool Client, int LeftSrc, 
                       int HeightSrc) {
     Picture result;
     Trapped(kModule, "CaptureWindow", [&] {
-        auto bitmap = platform::Env().windows->Capture(hWndSrc, Client, LeftSrc, TopSrc, WidthSrc, HeightSrc);
+        auto bitmap =
+            platform::Env().windows->Capture(hWndSrc, Client, LeftSrc, TopSrc, WidthSrc, HeightSrc, Scale());
         const bool captured = !bitmap.Empty();
         // A window that is gone still yields a picture of its size.
         if (!captured && WidthSrc > 0 && HeightSrc > 0)

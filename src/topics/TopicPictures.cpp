@@ -2,6 +2,7 @@
 
 #include "topics/TopicSections.h"
 
+#include "foundation/TextEncodings.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
@@ -52,8 +53,13 @@ Corners WithinFrame(Corners corners, const CXmlControl& subform) {
 
 } // namespace
 
-void TopicSections::AppendArea(std::string& out, const std::string& prefix, const CXmlForm& form,
-                               const CXmlControl& control, const CXmlControl* parent, bool ofTab) {
+std::string TopicSections::AreaName(const CXmlControl& control) const {
+    const std::string caption = control.Caption();
+    return caption.empty() && switches_.named ? control.Name : caption;
+}
+
+void TopicSections::AppendArea(std::string& out, const std::string& prefix, const CXmlControl& control,
+                               const CXmlControl* parent, bool ofTab) const {
     Corners corners;
     if (ofTab)
         corners = {control.TabHotSpotLeft(), control.TabHotSpotTop(), control.TabHotSpotRight(),
@@ -62,7 +68,7 @@ void TopicSections::AppendArea(std::string& out, const std::string& prefix, cons
         corners = {control.HotSpotLeft(), control.HotSpotTop(), control.HotSpotRight(),
                    control.HotSpotBottom()};
     else
-        corners = CornersInControlPicture(form, control, *parent);
+        corners = CornersInControlPicture(form_, control, *parent);
     if (!ofTab && parent != nullptr && parent->IsClass("SubForm")) {
         corners = WithinFrame(corners, *parent);
         if (corners[0] >= corners[2] || corners[1] >= corners[3])
@@ -74,7 +80,7 @@ void TopicSections::AppendArea(std::string& out, const std::string& prefix, cons
     out.append("\" HREF=\"#").append(prefix).append("_").append(ControlBookmark(control));
     // The text goes in as it stands, but for what would end the attribute or upset a compiler's reader.
     const std::string alt =
-        text::ReplaceAll(text::ReplaceAll(control.Caption(), "\"", "&quot;"), "<", "&lt;");
+        text::ReplaceAll(text::ReplaceAll(AreaName(control), "\"", "&quot;"), "<", "&lt;");
     out.append("\" FRAME=\"\" alt=\"").append(alt).append("\" />");
 }
 
@@ -89,7 +95,7 @@ void TopicSections::AppendMap(std::string& out) const {
             AppendAreasOfTabControl(out, *control);
             continue;
         }
-        AppendArea(out, prefix_, form_, *control, nullptr, false);
+        AppendArea(out, prefix_, *control, nullptr, false);
         out.append("\r\n");
     }
     out.append(kMapClosing);
@@ -97,7 +103,7 @@ void TopicSections::AppendMap(std::string& out) const {
 
 void TopicSections::AppendAreasOfTabControl(std::string& out, const CXmlControl& control) const {
     const auto append = [&](const CXmlControl& shown, bool ofTab) {
-        AppendArea(out, prefix_, form_, shown, nullptr, ofTab);
+        AppendArea(out, prefix_, shown, nullptr, ofTab);
         out.append("\r\n");
     };
     bool first = true;
@@ -120,7 +126,7 @@ void TopicSections::AppendMapOfControl(std::string& out, const CXmlControl& cont
     for (const auto& child : control.Controls)
         if (!child->IsLabel()) {
             const std::size_t before = out.size();
-            AppendArea(out, prefix_, form_, *child, &control, false);
+            AppendArea(out, prefix_, *child, &control, false);
             if (out.size() > before)
                 out.append("\r\n");
         }
@@ -144,11 +150,21 @@ std::string TopicSections::ImageSource(const std::string& localPath, const std::
     return path;
 }
 
-void TopicSections::AppendImageTag(std::string& out, const std::string& source,
-                                   const std::string& mapName) const {
+/// Areas count the pixels of the screen, so a picture with more pixels says how large it is shown.
+void TopicSections::AppendImageTag(std::string& out, const std::string& source, const std::string& mapName,
+                                   const std::string& shown, std::int32_t width, std::int32_t height) const {
     out.append("<IMG SRC=\"").append(source).append("\" BORDER=0 \r\n");
     if (form_.HasMap)
         out.append("USEMAP=\"#").append(mapName).append("\" ");
+    if (scaledImages_)
+        out.append("WIDTH=\"")
+            .append(std::to_string(width))
+            .append("\" HEIGHT=\"")
+            .append(std::to_string(height))
+            .append("\" ");
+    // Behind the rest, where whoever looks for the source or the map of a picture reads past it.
+    if (switches_.named)
+        out.append("ALT=\"").append(EncodeXmlText(shown)).append("\" ");
     out.append("/>\r\n");
 }
 
@@ -156,13 +172,15 @@ void TopicSections::AppendMainImage(std::string& out) const {
     if (!platform::Env().files->FileExists(FullImagePath(form_.PicFullPath())))
         return;
     out.append("<!-- + MAIN IMAGE + -->\r\n");
-    AppendImageTag(out, ImageSource(form_.PicLocalPath(), form_.PicFullPath()), prefix_);
+    AppendImageTag(out, ImageSource(form_.PicLocalPath(), form_.PicFullPath()), prefix_,
+                   FormDisplayName(form_), form_.Width, form_.Height);
     out.append("<!-- - MAIN IMAGE - -->\r\n");
 }
 
 void TopicSections::AppendControlImage(std::string& out, const CXmlControl& control) const {
     out.append("<!-- + CONTROL IMAGE + -->\r\n");
-    AppendImageTag(out, ImageSource(control.PicLocalPath(), control.PicFullPath), Anchor(control));
+    AppendImageTag(out, ImageSource(control.PicLocalPath(), control.PicFullPath), Anchor(control),
+                   ControlDisplayName(control), control.Width, control.Height + EdgeOf(form_, control));
     out.append("<!-- - CONTROL IMAGE - -->\r\n");
 }
 

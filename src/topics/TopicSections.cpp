@@ -53,6 +53,7 @@ TopicSections::TopicSections(const CXmlForm& form, TopicSwitches switches)
     : form_(form), switches_(std::move(switches)), prefix_(FormBookmarkPrefix(form)) {
     if (const CTovimarParameters* parameters = Session::Parameters()) {
         bulleted_ = parameters->BulletMenusControls;
+        scaledImages_ = parameters->ImagesScale != 1;
         if (parameters->InsertExternalDescriptions)
             descriptionsFolder_ = DescriptionsFolder();
     }

@@ -26,7 +26,7 @@ public:
         rectangle = {100, 100, 120, 110};
         client = {3, 4, 18, 9};
     }
-    platform::Bitmap Paint() override {
+    platform::Bitmap Paint(double) override {
         auto bitmap = platform::BlackBitmap(20, 10);
         for (std::size_t i = 0; i < bitmap.pixels.size(); ++i)
             bitmap.pixels[i] = static_cast<std::uint32_t>(i % 20 + i / 20 * 256);

@@ -79,6 +79,19 @@ TEST_F(TemplatesTest, AreasInAControlsPictureAreRelativeToItsFrame) {
               templates.ControlImage(*form, *form->GetControl("g"), true, ""));
 }
 
+TEST_F(TemplatesTest, PicturesOfAnotherScaleSayHowLargeTheyAreShown) {
+    auto form = Loaded("<Form Name='F' SourceProjectType='MS ACCESS' WindowSize='300, 200'><Controls>"
+                       "<OptionGroup Name='g' Size='90, 60' PicFileName='g.jpg'/>"
+                       "<Subform Name='s' Size='70, 50' PicFileName='s.jpg'/></Controls></Form>");
+    const auto image = [&](const char* name) {
+        return templates.ControlImage(*form, *form->GetControl(name), true, "");
+    };
+    EXPECT_EQ(std::string::npos, image("g").find("WIDTH"));
+    Session::Parameters()->ImagesScale = 1.5;
+    EXPECT_NE(std::string::npos, image("s").find("\r\nWIDTH=\"70\" HEIGHT=\"50\" />"));
+    EXPECT_NE(std::string::npos, image("g").find("WIDTH=\"90\" HEIGHT=\"68\" ")) << "with the frame's title";
+}
+
 TEST_F(TemplatesTest, PicturesByPathAreRelativeToTheTopicWhereTheyLieBelowIt) {
     auto form = Orders();
     EXPECT_NE(std::string::npos, templates.MainImage(*form, false, "").find("SRC=\"images\\Orders.jpg\""));

@@ -2,6 +2,7 @@
 
 #include "platform/windowing/WindowSystem.h"
 
+#include <cmath>
 #include <string>
 
 namespace tovimar::platform::access {
@@ -17,9 +18,10 @@ public:
         client = {0, 0, 1024, 768};
     }
 
-    Bitmap Paint() override {
+    Bitmap Paint(double scale) override {
         constexpr std::uint32_t kWorkArea = 0x00ABABAB;
-        Bitmap bitmap{rectangle.Width(), rectangle.Height(), {}};
+        const auto device = [scale](int value) { return static_cast<int>(std::lround(value * scale)); };
+        Bitmap bitmap{device(rectangle.Width()), device(rectangle.Height()), {}};
         bitmap.pixels.assign(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height),
                              kWorkArea);
         return bitmap;

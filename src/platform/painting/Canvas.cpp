@@ -26,12 +26,17 @@ Color Between(Color from, Color to, int step, int steps) {
 
 } // namespace
 
-Canvas::Canvas(Bitmap& bitmap) : bitmap_(bitmap), clip_{0, 0, bitmap.width, bitmap.height} {
+Canvas::Canvas(Bitmap& bitmap, double scale)
+    : bitmap_(bitmap), scale_(scale), clip_{0, 0, static_cast<int>(std::ceil(bitmap.width / scale)),
+                                            static_cast<int>(std::ceil(bitmap.height / scale))},
+      deviceClip_{0, 0, bitmap.width, bitmap.height} {
     auto* surface = cairo_image_surface_create_for_data(
         reinterpret_cast<unsigned char*>(bitmap.pixels.data()), CAIRO_FORMAT_RGB24, bitmap.width,
         bitmap.height, bitmap.width * 4);
     context_ = cairo_create(surface);
     cairo_surface_destroy(surface);
+    if (scale != 1)
+        cairo_scale(context_, scale, scale);
 }
 
 Canvas::~Canvas() {
@@ -43,55 +48,75 @@ bool Canvas::Visible(const Rectangle& area) const {
     return seen.Width() > 0 && seen.Height() > 0;
 }
 
-void Canvas::Row(int left, int right, int y, Color color) {
-    if (y < clip_.top || y >= clip_.bottom)
+int Canvas::Device(int value) const {
+    return scale_ == 1 ? value : static_cast<int>(std::lround(value * scale_));
+}
+
+Rectangle Canvas::Device(const Rectangle& area) const {
+    return {Device(area.left), Device(area.top), Device(area.right), Device(area.bottom)};
+}
+
+int Canvas::Thickness(int width) const {
+    return scale_ == 1 ? width : std::max(1, static_cast<int>(width * scale_));
+}
+
+void Canvas::FillDevice(const Rectangle& area, Color color) {
+    const auto seen = Common(area, deviceClip_);
+    if (seen.left >= seen.right)
         return;
-    left = std::max(left, clip_.left);
-    right = std::min(right, clip_.right);
-    if (left >= right)
-        return;
-    auto* row = bitmap_.pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(bitmap_.width);
-    std::fill(row + left, row + right, color);
+    for (int y = seen.top; y < seen.bottom; ++y) {
+        auto* row =
+            bitmap_.pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(bitmap_.width);
+        std::fill(row + seen.left, row + seen.right, color);
+    }
 }
 
 void Canvas::Fill(const Rectangle& area, Color color) {
-    const auto seen = Common(area, clip_);
-    for (int y = seen.top; y < seen.bottom; ++y)
-        Row(seen.left, seen.right, y, color);
+    FillDevice(Device(area), color);
 }
 
 void Canvas::FillGradient(const Rectangle& area, Color top, Color bottom) {
-    const auto seen = Common(area, clip_);
+    const auto device = Device(area);
+    const auto seen = Common(device, deviceClip_);
     for (int y = seen.top; y < seen.bottom; ++y)
-        Row(seen.left, seen.right, y, Between(top, bottom, y - area.top, area.Height() - 1));
+        FillDevice({device.left, y, device.right, y + 1},
+                   Between(top, bottom, y - device.top, device.Height() - 1));
 }
 
 void Canvas::Border(const Rectangle& area, Color color, int width) {
-    if (area.Width() <= 2 * width || area.Height() <= 2 * width)
-        return Fill(area, color);
-    Fill({area.left, area.top, area.right, area.top + width}, color);
-    Fill({area.left, area.bottom - width, area.right, area.bottom}, color);
-    Fill({area.left, area.top + width, area.left + width, area.bottom - width}, color);
-    Fill({area.right - width, area.top + width, area.right, area.bottom - width}, color);
+    const auto all = Device(area);
+    const int thick = Thickness(width);
+    if (all.Width() <= 2 * thick || all.Height() <= 2 * thick)
+        return FillDevice(all, color);
+    FillDevice({all.left, all.top, all.right, all.top + thick}, color);
+    FillDevice({all.left, all.bottom - thick, all.right, all.bottom}, color);
+    FillDevice({all.left, all.top + thick, all.left + thick, all.bottom - thick}, color);
+    FillDevice({all.right - thick, all.top + thick, all.right, all.bottom - thick}, color);
 }
 
 void Canvas::Edge(const Rectangle& area, Color leftTop, Color rightBottom) {
-    Fill({area.left, area.top, area.right - 1, area.top + 1}, leftTop);
-    Fill({area.left, area.top, area.left + 1, area.bottom - 1}, leftTop);
-    Fill({area.left, area.bottom - 1, area.right, area.bottom}, rightBottom);
-    Fill({area.right - 1, area.top, area.right, area.bottom}, rightBottom);
+    const auto all = Device(area);
+    const int thick = Thickness(1);
+    FillDevice({all.left, all.top, all.right - thick, all.top + thick}, leftTop);
+    FillDevice({all.left, all.top, all.left + thick, all.bottom - thick}, leftTop);
+    FillDevice({all.left, all.bottom - thick, all.right, all.bottom}, rightBottom);
+    FillDevice({all.right - thick, all.top, all.right, all.bottom}, rightBottom);
 }
 
 void Canvas::DottedBorder(const Rectangle& area, Color color) {
-    for (int x = area.left; x < area.right; x += 2) {
-        Row(x, x + 1, area.top, color);
-        if (area.Height() > 1)
-            Row(x, x + 1, area.bottom - 1, color);
+    const auto all = Device(area);
+    const int dot = Thickness(1);
+    for (int x = all.left; x < all.right; x += 2 * dot) {
+        const int end = std::min(x + dot, all.right);
+        FillDevice({x, all.top, end, all.top + dot}, color);
+        if (all.Height() > dot)
+            FillDevice({x, all.bottom - dot, end, all.bottom}, color);
     }
-    for (int y = area.top; y < area.bottom; y += 2) {
-        Row(area.left, area.left + 1, y, color);
-        if (area.Width() > 1)
-            Row(area.right - 1, area.right, y, color);
+    for (int y = all.top; y < all.bottom; y += 2 * dot) {
+        const int end = std::min(y + dot, all.bottom);
+        FillDevice({all.left, y, all.left + dot, end}, color);
+        if (all.Width() > dot)
+            FillDevice({all.right - dot, y, all.right, end}, color);
     }
 }
 
@@ -160,9 +185,14 @@ cairo_t* Canvas::Context() {
     if (clipPending_) {
         cairo_reset_clip(context_);
         cairo_new_path(context_);
-        cairo_rectangle(context_, clip_.left, clip_.top, std::max(0, clip_.Width()),
-                        std::max(0, clip_.Height()));
+        // In pixels of the picture: a clip between two of them would blur, and cost far more.
+        cairo_matrix_t scaled;
+        cairo_get_matrix(context_, &scaled);
+        cairo_identity_matrix(context_);
+        cairo_rectangle(context_, deviceClip_.left, deviceClip_.top, std::max(0, deviceClip_.Width()),
+                        std::max(0, deviceClip_.Height()));
         cairo_clip(context_);
+        cairo_set_matrix(context_, &scaled);
         clipPending_ = false;
     }
     return context_;
@@ -170,6 +200,7 @@ cairo_t* Canvas::Context() {
 
 void Canvas::SetClip(const Rectangle& clip) {
     clip_ = clip;
+    deviceClip_ = Common(Device(clip), {0, 0, bitmap_.width, bitmap_.height});
     clipPending_ = true;
 }
 
@@ -179,6 +210,14 @@ ClipTo::ClipTo(Canvas& canvas, const Rectangle& area) : canvas_(canvas), former_
 
 ClipTo::~ClipTo() {
     canvas_.SetClip(former_);
+}
+
+Bitmap UnpaintedPicture(const Rectangle& window, double scale) {
+    Bitmap bitmap;
+    bitmap.width = static_cast<int>(std::lround(window.Width() * scale));
+    bitmap.height = static_cast<int>(std::lround(window.Height() * scale));
+    bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) * static_cast<std::size_t>(bitmap.height));
+    return bitmap;
 }
 
 Rectangle Moved(const Rectangle& area, int x, int y) {

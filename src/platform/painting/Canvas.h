@@ -9,15 +9,17 @@
 typedef struct _cairo cairo_t;
 
 /// Painting on a picture. Straight shapes are written into the pixels; text and slanted lines go through
-/// Cairo. Colours are 0x00RRGGBB. Everything stays inside the clip.
+/// Cairo. Colours are 0x00RRGGBB. Everything stays inside the clip. All positions are in pixels of the
+/// window; on a picture of another scale they are brought to its pixels at the last moment, so that every
+/// edge falls between two of them.
 namespace tovimar::platform::painting {
 
 using Color = std::uint32_t;
 
 class Canvas {
 public:
-    /// The bitmap must outlive the canvas and keep its size.
-    explicit Canvas(Bitmap& bitmap);
+    /// The bitmap must outlive the canvas and keep its size; `scale` is its pixels per pixel of the window.
+    explicit Canvas(Bitmap& bitmap, double scale = 1);
     ~Canvas();
     Canvas(const Canvas&) = delete;
     Canvas& operator=(const Canvas&) = delete;
@@ -46,11 +48,19 @@ public:
 
 private:
     friend class ClipTo;
-    void Row(int left, int right, int y, Color color);
+    /// To pixels of the picture.
+    int Device(int value) const;
+    Rectangle Device(const Rectangle& area) const;
+    /// A line's thickness in pixels of the picture: the same for all lines of one width, and never 0.
+    int Thickness(int width) const;
+    /// Pixels of the picture, inside the clip.
+    void FillDevice(const Rectangle& area, Color color);
     void SetClip(const Rectangle& clip);
 
     Bitmap& bitmap_;
+    double scale_;
     Rectangle clip_;
+    Rectangle deviceClip_;
     bool clipPending_ = true;
     cairo_t* context_ = nullptr;
 };
@@ -67,6 +77,9 @@ private:
     Canvas& canvas_;
     Rectangle former_;
 };
+
+/// A picture of the window's size times `scale`, its pixels unset.
+Bitmap UnpaintedPicture(const Rectangle& window, double scale);
 
 Rectangle Moved(const Rectangle& area, int x, int y);
 Rectangle Shrunk(const Rectangle& area, int by);

@@ -35,21 +35,17 @@ public:
         return painted_.design != nullptr && painted_ != Now();
     }
 
-    Bitmap Paint() override {
+    Bitmap Paint(double scale) override {
         Place();
         painted_ = Now();
-        Bitmap bitmap;
-        bitmap.width = rectangle.Width();
-        bitmap.height = rectangle.Height();
-        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) *
-                             static_cast<std::size_t>(bitmap.height));
+        auto bitmap = painting::UnpaintedPicture(rectangle, scale);
         if (bitmap.Empty())
             return bitmap;
-        painting::Canvas canvas(bitmap);
+        painting::Canvas canvas(bitmap, scale);
         if (object_.design->root)
             PaintClient(canvas);
         if (framed_)
-            painting::PaintWindowFrame(canvas, {0, 0, bitmap.width, bitmap.height}, Look());
+            painting::PaintWindowFrame(canvas, {0, 0, rectangle.Width(), rectangle.Height()}, Look());
         return bitmap;
     }
 

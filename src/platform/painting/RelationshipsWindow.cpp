@@ -50,13 +50,9 @@ public:
         rectangle = {0, 0, client.right + left, client.bottom + left};
     }
 
-    Bitmap Paint() override {
-        Bitmap bitmap;
-        bitmap.width = rectangle.Width();
-        bitmap.height = rectangle.Height();
-        bitmap.pixels.resize(static_cast<std::size_t>(bitmap.width) *
-                             static_cast<std::size_t>(bitmap.height));
-        Canvas canvas(bitmap);
+    Bitmap Paint(double scale) override {
+        auto bitmap = painting::UnpaintedPicture(rectangle, scale);
+        Canvas canvas(bitmap, scale);
         canvas.Fill(client, 0xF4F6F8);
         {
             const painting::ClipTo clip(canvas, client);
@@ -68,7 +64,7 @@ public:
         painting::WindowFrame look;
         look.frame = frame_;
         look.caption = caption;
-        painting::PaintWindowFrame(canvas, {0, 0, bitmap.width, bitmap.height}, look);
+        painting::PaintWindowFrame(canvas, {0, 0, rectangle.Width(), rectangle.Height()}, look);
         return bitmap;
     }
 

@@ -3,6 +3,7 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <cmath>
 #include <cstring>
 #include <utility>
 #include <vector>
@@ -28,6 +29,12 @@ Bitmap Cut(const Bitmap& source, int left, int top, int width, int height) {
                     static_cast<std::size_t>(to - from) * sizeof(std::uint32_t));
     }
     return result;
+}
+
+double FittingScale(const Rectangle& window, double scale) {
+    constexpr double kMostPixels = 48e6;
+    const double pixels = static_cast<double>(window.Width()) * window.Height();
+    return pixels <= 0 ? 1 : std::max(1.0, std::min(scale, std::sqrt(kMostPixels / pixels)));
 }
 
 bool Matches(const std::string& asked, const std::string& have) {
@@ -93,19 +100,24 @@ WindowHandle WindowSystem::FindTopLevel(const std::string& className, const std:
     return 0;
 }
 
-Bitmap WindowSystem::Capture(WindowHandle handle, bool client, int left, int top, int width, int height) {
+Bitmap WindowSystem::Capture(WindowHandle handle, bool client, int left, int top, int width, int height,
+                             double scale) {
     Window* window = Find(handle);
     if (window == nullptr)
         return {};
-    if (painted_.handle != handle) {
-        painted_.bitmap = window->Paint();
+    scale = FittingScale(window->rectangle, scale);
+    if (painted_.handle != handle || painted_.scale != scale) {
+        painted_.bitmap = window->Paint(scale);
         painted_.handle = handle;
+        painted_.scale = scale;
     }
     if (client) {
         left += window->client.left;
         top += window->client.top;
     }
-    return Cut(painted_.bitmap, left, top, width, height);
+    const auto device = [scale](int value) { return static_cast<int>(std::lround(value * scale)); };
+    return Cut(painted_.bitmap, device(left), device(top), device(left + width) - device(left),
+               device(top + height) - device(top));
 }
 
 void WindowSystem::Invalidate(WindowHandle handle) {

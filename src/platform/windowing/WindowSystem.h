@@ -37,8 +37,9 @@ struct SystemMetrics {
 class Window {
 public:
     virtual ~Window() = default;
-    /// The whole window, frame included; a bitmap of Width x Height of its rectangle.
-    virtual Bitmap Paint() = 0;
+    /// The whole window, frame included; a bitmap of Width x Height of its rectangle, each times `scale`, at
+    /// least 1, and rounded.
+    virtual Bitmap Paint(double scale) = 0;
     /// Brings caption and rectangles up to date with what the window shows; True when a picture painted
     /// before is out of date. Asked before the window is handed out or captured.
     virtual bool Refresh() { return false; }
@@ -73,9 +74,12 @@ public:
     WindowHandle FindTopLevel(const std::string& className, const std::string& caption);
 
     /// Pixels of the rectangle, in window coordinates, or in client coordinates when `client` is set.
-    /// Parts outside the window are black. An unknown handle gives an empty bitmap.
-    /// The window is painted once and the picture kept until the window changes (`Invalidate`).
-    Bitmap Capture(WindowHandle handle, bool client, int left, int top, int width, int height);
+    /// Parts outside the window are black. An unknown handle gives an empty bitmap. With a `scale` other
+    /// than 1 every pixel of the window becomes that many of the bitmap each way, painted sharp at that size;
+    /// a window that would need more than 48 million pixels is painted at a lower scale, 1 at the least. The
+    /// window is painted once and the picture kept until the window changes (`Invalidate`).
+    Bitmap Capture(WindowHandle handle, bool client, int left, int top, int width, int height,
+                   double scale = 1);
     /// The next capture paints the window anew.
     void Invalidate(WindowHandle handle);
 
@@ -85,6 +89,7 @@ private:
     std::map<WindowHandle, std::unique_ptr<Window>> windows_; // handles grow, so order is z-order
     struct Painted {
         WindowHandle handle = 0;
+        double scale = 1;
         Bitmap bitmap;
     } painted_;
 };

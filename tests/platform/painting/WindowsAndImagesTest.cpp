@@ -1,6 +1,9 @@
 #include "platform/imaging/Image.h"
 #include "platform/imaging/Jpeg.h"
+#include "platform/imaging/PictureSize.h"
 #include "platform/painting/PaintingTest.h"
+
+#include <cmath>
 
 namespace tovimar::test {
 
@@ -24,7 +27,7 @@ public:
         rectangle = {0, 0, 2, 2};
         client = {1, 1, 2, 2};
     }
-    Bitmap Paint() override {
+    Bitmap Paint(double) override {
         ++painted;
         return FourPixels();
     }
@@ -48,6 +51,86 @@ TEST(Windows, CapturesCutFromOnePainting) {
     EXPECT_EQ(window->painted, 2);
     EXPECT_TRUE(windows.Capture(handle, false, 0, 0, 0, 5).Empty());
     EXPECT_TRUE(windows.Capture(999, false, 0, 0, 5, 5).Empty());
+}
+
+TEST(Windows, ALargerScaleMultipliesEveryPixelAndKeepsItsPlace) {
+    DesignApplication application;
+    const auto& form = application.AddForm("Shapes", R"(Begin Form
+    RecordSelectors = NotDefault
+    NavigationButtons = NotDefault
+    ScrollBars =0
+    BorderStyle =0
+    Width =3000
+    Begin
+        Begin Section
+            Height =1500
+            BackColor =16768477
+            Name ="Detail"
+            Begin
+                Begin Rectangle
+                    OldBorderStyle =1
+                    BorderWidth =1
+                    BorderColor =255
+                    BackStyle =1
+                    BackColor =65280
+                    Left =150
+                    Top =165
+                    Width =915
+                    Height =600
+                    Name ="Box"
+                End
+                Begin Rectangle
+                    SpecialEffect =2
+                    BackStyle =1
+                    Left =1500
+                    Top =165
+                    Width =915
+                    Height =600
+                    Name ="Sunken"
+                End
+            End
+        End
+    End
+End
+)");
+    OpenedWindow window(form, &application, access::View::Form);
+    const auto area = window.windows.Find(window.object.window)->rectangle;
+    const auto plain = window.Picture();
+    const auto at = [&](double scale) {
+        return window.windows.Capture(window.object.window, false, 0, 0, area.Width(), area.Height(), scale);
+    };
+    const auto twice = at(2);
+    ASSERT_EQ(twice.width, 2 * plain.width);
+    ASSERT_EQ(twice.height, 2 * plain.height);
+    std::size_t different = 0;
+    for (int y = 0; y < twice.height; ++y)
+        for (int x = 0; x < twice.width; ++x)
+            different += twice.pixels[static_cast<std::size_t>(y * twice.width + x)] !=
+                         plain.pixels[static_cast<std::size_t>(y / 2 * plain.width + x / 2)];
+    EXPECT_EQ(different, 0U);
+
+    EXPECT_EQ(at(1.5).width, std::lround(area.Width() * 1.5));
+    const auto cut = window.windows.Capture(window.object.window, false, 11, 12, 9, 7, 2);
+    EXPECT_EQ(cut.width, 18);
+    EXPECT_EQ(cut.height, 14);
+    EXPECT_EQ(cut.pixels.at(0), plain.pixels[static_cast<std::size_t>(12 * plain.width + 11)]);
+}
+
+TEST(Windows, AWindowTooLargeForAScaleIsPaintedSmaller) {
+    class Huge : public CountingWindow {
+    public:
+        Huge() : CountingWindow("Huge") { rectangle = {0, 0, 6000, 4000}; }
+        Bitmap Paint(double asked) override {
+            scale = asked;
+            return {};
+        }
+        double scale = 0;
+    };
+    WindowSystem windows;
+    auto made = std::make_unique<Huge>();
+    const auto* window = made.get();
+    windows.Capture(windows.Open(std::move(made)), false, 0, 0, 1, 1, 2);
+    EXPECT_NEAR(window->scale * window->scale * 6000 * 4000, 48e6, 1);
 }
 
 TEST(Windows, AWindowTakesThoseBelowItWithIt) {
@@ -101,6 +184,17 @@ TEST(Images, WhatWasWrittenIsReadBack) {
     EXPECT_EQ(EncodeJpeg(Bitmap{}, 90, jpeg), JpegCode::kNoImage);
 }
 
+TEST(Images, ThePictureSizeComesFromTheHeaders) {
+    std::string jpeg;
+    ASSERT_EQ(EncodeJpeg(BlackBitmap(37, 21), 90, jpeg), JpegCode::kOk);
+    EXPECT_EQ(PictureSize(jpeg), std::pair(37, 21));
+    EXPECT_EQ(PictureSize(EncodeBmp(FourPixels())), std::pair(2, 2));
+    for (std::size_t length = 0; length < 30; ++length)
+        PictureSize(std::string_view(jpeg).substr(0, length)); // reads nothing behind the end
+    EXPECT_FALSE(PictureSize(std::string_view(jpeg).substr(0, 20)));
+    EXPECT_FALSE(PictureSize("GIF89a"));
+}
+
 TEST(Images, DamagedPicturesGiveNone) {
     const auto bytes = EncodeBmp(FourPixels());
     EXPECT_FALSE(DecodeImage(""));
@@ -120,10 +214,10 @@ TEST(Images, TheRelationshipsWindowShowsItsTables) {
         {{"Customers", "ID", "Orders", "Customer", false}, {"Nowhere", "ID", "Orders", "ID", false}},
         metrics);
     EXPECT_EQ(window->className, "OSysRel");
-    const auto picture = window->Paint();
+    const auto picture = window->Paint(1);
     EXPECT_EQ(picture.width, window->rectangle.Width());
     EXPECT_GT(picture.width, 200);
-    EXPECT_FALSE(access::MakeRelationshipsWindow({}, {}, metrics)->Paint().Empty());
+    EXPECT_FALSE(access::MakeRelationshipsWindow({}, {}, metrics)->Paint(1).Empty());
 }
 
 } // namespace tovimar::test
