@@ -114,6 +114,11 @@ std::string Encode(const std::string& text, const Rules& rules) {
     return out;
 }
 
+/// Every "&" as its reference, which both encoders leave alone.
+std::string WithReferredMarks(const std::string& name) {
+    return text::ReplaceAll(name, "&", "&#38;");
+}
+
 /// Character of a decimal reference "&#39;"; 0 for one that has none.
 char32_t NumberedCharacter(std::string_view candidate) {
     if (!IsNumericReference(candidate))
@@ -159,6 +164,14 @@ std::string EncodeSpecialChars(const std::string& text, bool vfCyrillicAsEntity)
 
 std::string EncodeXmlText(const std::string& text, bool rfCyrillicAsEntity) {
     return Encode(text, {rfCyrillicAsEntity, true, true, true});
+}
+
+std::string EncodeXmlName(const std::string& name) {
+    return EncodeXmlText(WithReferredMarks(name));
+}
+
+std::string EncodeSpecialName(const std::string& name) {
+    return EncodeSpecialChars(WithReferredMarks(name));
 }
 
 std::string DecodeHtmlEntities(const std::string& text) {

@@ -16,6 +16,12 @@ std::string EncodeSpecialChars(const std::string& text, bool vfCyrillicAsEntity 
 /// For definitions and topics. Named entities become their numeric form; ";" stays.
 std::string EncodeXmlText(const std::string& text, bool rfCyrillicAsEntity = false);
 
+/// `EncodeXmlText` for a name, which means itself: an "&" in it begins no entity, so that a name such as
+/// "R&amp;D" reads back as it was.
+std::string EncodeXmlName(const std::string& name);
+/// `EncodeSpecialChars` for a name.
+std::string EncodeSpecialName(const std::string& name);
+
 /// Entities become characters: first every "&amp;", then all named ones, then the numeric ones. Names are
 /// looked up as written, then without regard to case. Numbers 128 to 159 are taken from the ANSI code page.
 std::string DecodeHtmlEntities(const std::string& text);

@@ -108,7 +108,7 @@ void CHelpPrjTreeNode::AppendXml(std::string& out, std::int32_t level, bool skip
 
 void CHelpPrjTreeNode::AppendXmlFirstLine(std::string& out, bool nameIsGiven) const {
     if (!nameIsGiven)
-        AppendFirst(out, "name", EncodeSpecialChars(Name()));
+        AppendFirst(out, "name", EncodeSpecialName(Name()));
     if (const auto type = ObjectType(); type != -1)
         AppendFirst(out, "type", std::to_string(type));
     AppendFirst(out, "caption", EncodeSpecialChars(Caption()));
@@ -124,16 +124,16 @@ void CHelpPrjTreeNode::AppendXmlFirstLine(std::string& out, bool nameIsGiven) co
 
 void CHelpPrjTreeNode::AppendXmlLines(std::string& out, std::int32_t level) {
     AttributeLines lines(out, level);
-    lines.Add("key", EncodeSpecialChars(Key()));
+    lines.Add("key", EncodeSpecialName(Key()));
     if (Parent != nullptr)
-        lines.Add("pkey", EncodeSpecialChars(Parent->Key()));
+        lines.Add("pkey", EncodeSpecialName(Parent->Key()));
     if (const auto* previous = TreeViewNode == nullptr ? nullptr : TreeViewNode->Previous()) {
         SetPreviousNodeKey(previous->Key());
-        lines.Add("pnodekey", EncodeSpecialChars(previous->Key()));
+        lines.Add("pnodekey", EncodeSpecialName(previous->Key()));
     }
     if (const auto* next = TreeViewNode == nullptr ? nullptr : TreeViewNode->Next()) {
         SetNextNodeKey(next->Key());
-        lines.Add("nnodekey", EncodeSpecialChars(next->Key()));
+        lines.Add("nnodekey", EncodeSpecialName(next->Key()));
     }
     lines.AddFilled("icon", PlainValue(Icon()));
     lines.AddFilled("title", EncodeSpecialChars(HtmlTitle()));
@@ -142,8 +142,8 @@ void CHelpPrjTreeNode::AppendXmlLines(std::string& out, std::int32_t level) {
     lines.AddFilled("extraValue", EncodeSpecialChars(ExtraValue()));
     if (Skipped())
         lines.Add("skipped", "-1");
-    lines.AddFilled("OriginalKey", EncodeSpecialChars(OriginalKey()));
-    lines.AddFilled("POriginalKey", EncodeSpecialChars(ParentOriginalKey()));
+    lines.AddFilled("OriginalKey", EncodeSpecialName(OriginalKey()));
+    lines.AddFilled("POriginalKey", EncodeSpecialName(ParentOriginalKey()));
 }
 
 } // namespace tovimar

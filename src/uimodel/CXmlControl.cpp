@@ -51,7 +51,7 @@ std::string CXmlControl::Caption() const {
 }
 
 std::string CXmlControl::Name4Xml() const {
-    return EncodeXmlText(Name);
+    return EncodeXmlName(Name);
 }
 std::string CXmlControl::Text4Xml() const {
     return EncodeXmlText(text_);

@@ -147,14 +147,14 @@ void CXmlControl::AppendAttributes(std::string& out) {
         Append(out, "HotSpot = \"", HotSpotText());
     if (TabLeft >= 0)
         Append(out, "TabPageTab = \"", TabPageTabText());
-    AppendUnlessEmpty(out, "SectionName = \"", EncodeXmlText(ControlSectionName));
-    AppendUnlessEmpty(out, "ParentControlName = \"", EncodeXmlText(ParentControlName));
+    AppendUnlessEmpty(out, "SectionName = \"", EncodeXmlName(ControlSectionName));
+    AppendUnlessEmpty(out, "ParentControlName = \"", EncodeXmlName(ParentControlName));
     if (Level > 0)
         Append(out, "Level = \"", Level);
     if (TabPageIndex > -1)
         Append(out, "TabPageIndex = \"", TabPageIndex);
     if (!text::EqualsIgnoringCase(bookmarkName_, Name))
-        AppendUnlessEmpty(out, "BookmarkName = \"", EncodeXmlText(bookmarkName_));
+        AppendUnlessEmpty(out, "BookmarkName = \"", EncodeXmlName(bookmarkName_));
     AppendUnlessEmpty(out, "Indexes = \"", EncodeXmlText(Indexes));
 }
 

@@ -57,7 +57,7 @@ std::string CXmlForm::StylesheetFullPath() const {
 }
 
 std::string CXmlForm::Name4Xml() const {
-    return EncodeXmlText(Name);
+    return EncodeXmlName(Name);
 }
 std::string CXmlForm::Text4Xml() const {
     return EncodeXmlText(Text);

@@ -297,7 +297,7 @@ void CXmlForm::AppendOrigin(std::string& out) const {
         Append(out, "NewHelpContextIdsCount = \"", NewHelpContextIdsCount);
     AppendPlain(out, "SourceProjectType = \"", SourceProjectType);
     AppendPlain(out, "SourceProjectName = \"", SourceProjectName);
-    AppendUnlessEmpty(out, "OriginalClassName = \"", EncodeXmlText(OriginalClassName));
+    AppendUnlessEmpty(out, "OriginalClassName = \"", EncodeXmlName(OriginalClassName));
     AppendPlain(out, "GUIObjectSubType = \"", GUIObjectSubType);
     if (hWnd != 0)
         Append(out, "HWND = \"", hWnd);

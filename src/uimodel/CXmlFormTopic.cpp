@@ -18,16 +18,15 @@ namespace tovimar {
 
 /// What one rendering is asked for.
 struct CXmlForm::Rendering {
-    std::string path; ///< of the topic; empty renders to nowhere
+    const std::string& path; ///< of the topic; empty renders to nowhere
     std::string templateName;
-    bool report = false;
-    bool zoom = false;
-    bool localImagePath = true;
-    std::string picsFolder;
-    std::string queryXml;
-    bool fillsDescription = false; ///< tables and worksheets have "{{Description}}"
-    bool fillsObjects = false;     ///< worksheets have "{{Objects}}"
-    std::string worksheetHtml;
+    bool report;
+    bool zoom;
+    bool localImagePath;
+    const std::string& picsFolder;
+    std::string queryXml = {};
+    bool fillsDescription = false;              ///< tables and worksheets have "{{Description}}"
+    const std::string* worksheetHtml = nullptr; ///< worksheets have "{{Objects}}"
 };
 
 namespace {
@@ -45,29 +44,16 @@ bool ReadsBackAsWritten(const std::string& topic) {
 ResultCode CXmlForm::SaveHTMLEx(const std::string& htmlFileFullPath, bool HtmlOfReport,
                                 bool vfApplyZoomFactor, bool vfUseLocalImagePath,
                                 const std::string& vstrPicsDir) {
-    Rendering rendering;
-    rendering.path = htmlFileFullPath;
-    rendering.templateName = "form.htm";
-    rendering.report = HtmlOfReport;
-    rendering.zoom = vfApplyZoomFactor;
-    rendering.localImagePath = vfUseLocalImagePath;
-    rendering.picsFolder = vstrPicsDir;
-    return Render("SaveHTMLEx", rendering);
+    return Render("SaveHTMLEx", {htmlFileFullPath, "form.htm", HtmlOfReport, vfApplyZoomFactor,
+                                 vfUseLocalImagePath, vstrPicsDir});
 }
 
 ResultCode CXmlForm::SaveHTML4Table(const std::string& htmlFileFullPath, const std::string& vstrHtmlFileName,
                                     bool HtmlOfReport, bool vfApplyZoomFactor, bool vfUseLocalImagePath,
                                     const std::string& vstrPicsDir, const std::string& vstrQryXml) {
-    Rendering rendering;
-    rendering.path = htmlFileFullPath;
-    rendering.templateName = vstrHtmlFileName;
-    rendering.report = HtmlOfReport;
-    rendering.zoom = vfApplyZoomFactor;
-    rendering.localImagePath = vfUseLocalImagePath;
-    rendering.picsFolder = vstrPicsDir;
-    rendering.queryXml = vstrQryXml;
-    rendering.fillsDescription = true;
-    return Render("SaveHTML4Table", rendering);
+    return Render("SaveHTML4Table",
+                  {htmlFileFullPath, vstrHtmlFileName, HtmlOfReport, vfApplyZoomFactor, vfUseLocalImagePath,
+                   vstrPicsDir, vstrQryXml, /*fillsDescription=*/true});
 }
 
 ResultCode CXmlForm::SaveHTML4Worksheet(const std::string& htmlFileFullPath,
@@ -75,18 +61,9 @@ ResultCode CXmlForm::SaveHTML4Worksheet(const std::string& htmlFileFullPath,
                                         bool vfApplyZoomFactor, bool vfUseLocalImagePath,
                                         const std::string& vstrPicsDir, const std::string& vstrQryXml,
                                         const std::string& vstrWksHtml) {
-    Rendering rendering;
-    rendering.path = htmlFileFullPath;
-    rendering.templateName = vstrHtmlFileName;
-    rendering.report = HtmlOfReport;
-    rendering.zoom = vfApplyZoomFactor;
-    rendering.localImagePath = vfUseLocalImagePath;
-    rendering.picsFolder = vstrPicsDir;
-    rendering.queryXml = vstrQryXml;
-    rendering.fillsDescription = true;
-    rendering.fillsObjects = true;
-    rendering.worksheetHtml = vstrWksHtml;
-    return Render("SaveHTML4Worksheet", rendering);
+    return Render("SaveHTML4Worksheet",
+                  {htmlFileFullPath, vstrHtmlFileName, HtmlOfReport, vfApplyZoomFactor, vfUseLocalImagePath,
+                   vstrPicsDir, vstrQryXml, /*fillsDescription=*/true, &vstrWksHtml});
 }
 
 ResultCode CXmlForm::Render(const char* operation, const Rendering& rendering) {
@@ -127,8 +104,8 @@ std::string CXmlForm::RenderText(const Rendering& rendering) {
     topic = text::ReplaceAll(topic, "{{StyleSheetLinkHtml}}", GetStyleSheetLinkHtml(stylesheetFullPath_));
     if (rendering.fillsDescription)
         ReplaceTag(topic, "{{Description}}", Description);
-    if (rendering.fillsObjects)
-        ReplaceTag(topic, "{{Objects}}", rendering.worksheetHtml);
+    if (rendering.worksheetHtml != nullptr)
+        ReplaceTag(topic, "{{Objects}}", *rendering.worksheetHtml);
     if (rendering.fillsDescription)
         topic = Session::Messages()->ReplaceParameters(topic);
     return topic;

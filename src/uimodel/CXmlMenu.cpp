@@ -20,7 +20,7 @@ void FillIndexes(CXmlMenu& menu) {
 } // namespace
 
 std::string CXmlMenu::Name4Xml() const {
-    return EncodeXmlText(Name);
+    return EncodeXmlName(Name);
 }
 
 std::string CXmlMenu::NameNormalized() const {

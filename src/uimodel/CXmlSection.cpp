@@ -11,7 +11,7 @@ namespace tovimar {
 using namespace definition;
 
 std::string CXmlSection::Name4Xml() const {
-    return EncodeXmlText(Name);
+    return EncodeXmlName(Name);
 }
 
 std::string CXmlSection::NameNormalized() const {

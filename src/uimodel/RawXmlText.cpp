@@ -10,14 +10,14 @@ using namespace definition;
 
 void AppendRawRoot(std::string& out, const RawRoot& root) {
     out.append("<").append(root.tag);
-    Append(out, " Name = \"", EncodeXmlText(root.name));
+    Append(out, " Name = \"", EncodeXmlName(root.name));
     Append(out, "Text = \"", EncodeXmlText(root.caption));
     Append(out, "Caption = \"", EncodeXmlText(root.caption));
     AppendPair(out, "WindowSize = \"", root.width, root.height);
     Append(out, "BorderStyle = \"", root.borderStyle);
     Append(out, "NamePrefix = \"", Escaped(root.namePrefix));
     AppendPair(out, "ClientAreaOffset = \"", root.clientAreaOffsetX, root.clientAreaOffsetY);
-    Append(out, "OriginalClassName = \"", EncodeXmlText(root.originalClassName));
+    Append(out, "OriginalClassName = \"", EncodeXmlName(root.originalClassName));
     if (root.helpContextId >= 1 || root.helpContextId == -1)
         Append(out, "HelpContextId = \"", root.helpContextId);
     AppendPlain(out, "SourceProjectType = \"", root.sourceProjectType);
@@ -30,7 +30,7 @@ void AppendRawRoot(std::string& out, const RawRoot& root) {
 void AppendRawControl(std::string& out, const RawControl& control, const std::vector<std::string>& children) {
     const std::string indent = Indent(control.level);
     out.append(indent).append("<").append(control.type);
-    Append(out, " Name = \"", EncodeXmlText(control.name));
+    Append(out, " Name = \"", EncodeXmlName(control.name));
     Append(out, "Text = \"", EncodeXmlText(control.text));
     Append(out, "Caption = \"", EncodeXmlText(control.caption));
     AppendPair(out, "Location = \"", control.left, control.top);
@@ -44,7 +44,7 @@ void AppendRawControl(std::string& out, const RawControl& control, const std::ve
         Append(out, "HelpContextId = \"", control.helpContextId);
     AppendUnlessEmpty(out, "Description = \"", EncodeXmlText(control.description));
     AppendPlain(out, "SectionName = \"", control.sectionName);
-    AppendUnlessEmpty(out, "ParentControlName = \"", EncodeXmlText(control.parentControlName));
+    AppendUnlessEmpty(out, "ParentControlName = \"", EncodeXmlName(control.parentControlName));
     AppendPlain(out, "OriginalClassName = \"", control.originalClassName);
     if (control.level > 0)
         Append(out, "Level = \"", control.level);

@@ -67,6 +67,14 @@ TEST_F(TextEncodingsTest, EntitiesAreNotEncodedAgain) {
     }
 }
 
+TEST_F(TextEncodingsTest, NamesReadBackAsTheyWereWhateverTheyLookLike) {
+    EXPECT_EQ(EncodeXmlName("R&amp;D"), "R&#38;amp;D");
+    EXPECT_EQ(EncodeSpecialName("R&amp;D"), "R&#38;amp&#59;D");
+    EXPECT_EQ(EncodeXmlName("&#65; < &"), "&#38;#65; &#60; &#38;");
+    for (const std::string name : {"plain_1", "A & B;", "\"x\"", "Заказ"})
+        EXPECT_EQ(EncodeXmlName(name), EncodeXmlText(name));
+}
+
 TEST(SpecialChars, HoldTheWholeTable) {
     const CSpecialChars table;
     EXPECT_EQ(table.GetNumCode("&nbsp;"), "&#160;");

@@ -107,13 +107,14 @@ TEST_F(TreeFileTest, RepairsTakenKeysAndReportsWhatCantBeRepaired) {
 }
 
 TEST_F(TreeFileTest, HostileValuesDontBreakTheFile) {
-    LoadTree("<Project><P key='a&lt;\"b' caption='&lt;&quot;&amp;&gt;' "
+    LoadTree("<Project><P name='R&amp;amp;D' key='a&lt;\"b&amp;lt;' caption='&lt;&quot;&amp;&gt;' "
              "GeneratedHtmlFile='x&quot;&amp;.htm'/></Project>");
     const auto text = SavedText();
     ASSERT_EQ(tree.Load(Path("Saved.tvp")), 0) << text;
     const auto& node = *tree.Root()->Children().At(1);
     EXPECT_EQ(node.GeneratedHTMLFile(), "x\"&.htm");
-    EXPECT_EQ(node.Key(), "a<\"b");
+    EXPECT_EQ(node.Key(), "a<\"b&lt;");
+    EXPECT_EQ(node.Name(), "R&amp;D");
     EXPECT_EQ(node.Caption(), "<\"&>");
 }
 

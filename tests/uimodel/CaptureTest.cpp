@@ -90,6 +90,40 @@ TEST_F(CaptureTest, FieldsOfATableAreItsControls) {
     EXPECT_EQ("Key & more", table.Controls.At(1)->Description);
 }
 
+TEST_F(CaptureTest, EveryKindOfContainerIsWalked) {
+    auto form = MakeObject("Report_R", {{"Caption", "R"}});
+    for (const char* kind : {"Subform", "subreport", "GroupBox", "Frame", "PictureBox", "Panel"}) {
+        auto container = Control(kind, kind, "", 0, 0);
+        container->children = {Control("TextBox", "inner", "I", 1, 1)};
+        form->children.push_back(container);
+    }
+    auto tabs = Control("SSTab", "tabs", "", 0, 0);
+    tabs->Set("Pages(0)", HostObject(Control("Page", "p", "P", 0, 0)));
+    tabs->pages = {{}};
+    form->children.push_back(tabs);
+    form->children.push_back(Control("ComboBox", "R&amp;D", "C", 0, 0));
+    processor.open = form;
+    const std::string raw =
+        CClientUIObjectRawXml().Get_(processor, 3, MakeObject("AccessObject", {{"Name", "R&amp;D"}}), 0);
+    test::ExpectGolden("uimodel/containers_raw.xml", raw);
+    CXmlForm report;
+    ASSERT_EQ(kSuccess, report.LoadXml(raw));
+    EXPECT_EQ("R&amp;D", report.Name);
+    EXPECT_EQ("R&amp;D", report.Controls.At(8)->Name);
+}
+
+TEST_F(CaptureTest, ObjectsWithoutAWindowAreTheirFields) {
+    for (const auto& [type, tag] : std::vector<std::pair<std::int32_t, std::string>>{
+             {1, "Query"}, {4, "Macro"}, {81, "Worksheet"}, {82, "Chart"}}) {
+        processor.calls.clear();
+        const std::string raw =
+            CClientUIObjectRawXml().Get_(processor, type, MakeObject("AccessObject", {{"Name", "o"}}), 0);
+        EXPECT_EQ(0U, raw.find("<" + tag + " Name = \"o\" Text = \"o\" Caption = \"o\" ")) << raw;
+        EXPECT_NE(std::string::npos, raw.find("</" + tag + ">\r\n"));
+        EXPECT_EQ("events help id fields o " + tag + " menus", text::Join(processor.calls, " "));
+    }
+}
+
 std::string Raw(const std::string& kind, const std::string& controls, const std::string& more = {}) {
     return "<Form Name='Orders' Text='O' BorderStyle='2' SourceProjectType='" + kind +
            "' ><Sections>"

@@ -2,6 +2,7 @@
 
 #include "foundation/Session.h"
 #include "generation/CTovimarParameters.h"
+#include "platform/text/Text.h"
 #include "support/FakeEnvironment.h"
 #include "support/Golden.h"
 
@@ -62,6 +63,62 @@ TEST_F(DefinitionTest, WritesTheFixedFormatAndReadsItsOwnTextToTheSameBytes) {
     ASSERT_EQ(kSuccess, again.Load(Path("Orders.xml")));
     EXPECT_EQ(written, again.XMLSTr());
     EXPECT_EQ("<?xml version=\"1.0\" encoding=\"utf-8\" ?>\r\n" + written, ReadFile(Path("Orders.xml")));
+}
+
+/// Each attribute with its condition met, then a control for which none is.
+constexpr const char* kAllOfAControl =
+    "<Frame Name='n&amp;amp;' Text='T &lt;' Description='D \"' ClassName='GroupBox' "
+    "OriginalClassName='Frame1' "
+    "Location='1, 2' Size='3,4' TabIndex='5' Index='6' HelpContextId='7' PicFileName='p.jpg' Visible='False' "
+    "HotSpot='9,9,9,9' TabPageTab='1, 2, 3, 4' SectionName='S&amp;1' ParentControlName='P&amp;lt;' Level='2' "
+    "TabPageIndex='0' BookmarkName='read anew' Indexes='k &amp; w'/>"
+    "<Frame Name='N&amp;amp;' OriginalClassName='FRAME' Location='-1, -1' TabIndex='-1' Index='0' "
+    "HelpContextId='0' Visible='True' TabPageTab='-1,0,0,0'/>"
+    "<Frame Name='bare'/>";
+
+TEST_F(DefinitionTest, WritesEachAttributeOfAControlUnderItsCondition) {
+    auto form = Loaded(WithControls(kAllOfAControl));
+    const std::string written = form->XMLSTr();
+    test::ExpectGolden("uimodel/control_attributes.xml", written);
+    auto again = Loaded(written);
+    // A tab index of -1 isn't written, so it reads as 0; from then on nothing changes.
+    const std::string stable = again->XMLSTr();
+    EXPECT_EQ(text::ReplaceAll(written, "\"0, 0\" BookmarkName", "\"0, 0\" TabIndex = \"0\" BookmarkName"),
+              stable);
+    EXPECT_EQ(stable, Loaded(stable)->XMLSTr());
+    // An entity in a name is part of the name.
+    EXPECT_EQ("n&amp;", again->Controls.At(1)->Name);
+    EXPECT_EQ("P&lt;", again->Controls.At(1)->ParentControlName);
+}
+
+TEST_F(DefinitionTest, TheElementTellsTheKind) {
+    for (const auto& [kind, type] : std::vector<std::pair<std::string, std::int32_t>>{{"Form", 2},
+                                                                                      {"Report", 3},
+                                                                                      {"Table", 0},
+                                                                                      {"Query", 1},
+                                                                                      {"Macro", 4},
+                                                                                      {"Worksheet", 81},
+                                                                                      {"Chart", 82}}) {
+        auto form = Loaded("<" + kind + " Name='A &amp;amp; B'/>");
+        EXPECT_EQ(kind, form->Type_());
+        EXPECT_EQ(type, form->SourceObjectType);
+        const std::string xaml = form->MyXaml();
+        CXmlForm inXaml;
+        EXPECT_EQ(kSuccess, inXaml.LoadXml(xaml)) << xaml;
+        EXPECT_EQ("A &amp; B", inXaml.Name);
+    }
+}
+
+TEST_F(DefinitionTest, PropertiesAnswerByTheirNames) {
+    auto form = Loaded(
+        "<Form Name='F' Text='T' HelpContextId='5'><Menu><MenuEntry Name='m' Text='M'/></Menu></Form>");
+    EXPECT_EQ("T", form->Properties("Caption").AsString());
+    EXPECT_EQ(5, form->Properties("HelpContextId").AsInteger());
+    EXPECT_TRUE(form->Properties("caption").IsNull());
+    const CXmlMenu& menu = *form->Menus.At(1);
+    EXPECT_EQ("M", menu.Properties("Text").AsString());
+    EXPECT_EQ("M", menu.Properties("Caption").AsString());
+    EXPECT_TRUE(menu.Properties("text").IsNull());
 }
 
 TEST_F(DefinitionTest, AFormWithNothingKeepsWhatIsAlwaysWritten) {

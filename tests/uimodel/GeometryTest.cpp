@@ -1,3 +1,4 @@
+#include "uimodel/CNonClientMetrics.h"
 #include "uimodel/CScaler.h"
 #include "uimodel/HotSpots.h"
 #include "uimodel/clsAccFormColumn.h"
@@ -77,6 +78,86 @@ TEST_F(GeometryTest, FormViewHasARecordSelectorAndNoBars) {
     EXPECT_EQ((platform::Rectangle{27, 40, 127, 59}), dimensions.ControlRectangle(control, false));
     EXPECT_EQ(17, dimensions.DatasheetFormRecordSelectorWidth());
     EXPECT_EQ(18, dimensions.DatasheetFormTitleHeight());
+}
+
+TEST_F(GeometryTest, BordersAndViewsMakeTheFrame) {
+    struct Case {
+        std::int32_t view, borderStyle, x, y;
+    };
+    // Metrics: border 1, caption 18, scroll bars 17.
+    for (const Case& it : {Case{1, 0, 0, 0},
+                           {1, 1, 0, 21},
+                           {1, 2, 8, 25},
+                           {1, 3, 0, 21},
+                           {1, 9, 8, 25},
+                           {2, 0, 8, 25},
+                           {0, 0, 8, 25}}) {
+        const HostObject form = Form(it.view, {{"BorderStyle", it.borderStyle}});
+        EXPECT_EQ(it.x, dimensions.FormClientAreaOffsetX(processor, form, false))
+            << it.view << it.borderStyle;
+        EXPECT_EQ(it.y, dimensions.FormClientAreaOffsetY(processor, form, false))
+            << it.view << it.borderStyle;
+    }
+    // A report without a view counts as open in design.
+    const HostObject report = MakeObject("Report_R");
+    EXPECT_EQ(8, dimensions.FormClientAreaOffsetX(processor, report, false));
+    EXPECT_EQ("<Section Name=\"Detail\" ClientAreaOffset = \"0, 0\" Height=\"0\" DesignTimeHeaderHeight = "
+              "\"18\"/>\r\n",
+              dimensions.SectionsXML(processor, report, false));
+}
+
+TEST_F(GeometryTest, TitlesOfOtherHostsGoByTheBorderStyle) {
+    CNonClientMetrics metrics;
+    metrics.SearchMetrics();
+    const std::vector<std::int32_t> expected{0, 18, 18, 18, 17, 17, 0};
+    for (std::int32_t style = 0; style < 7; ++style)
+        EXPECT_EQ(expected[static_cast<std::size_t>(style)], metrics.GetFormNCM(style)) << style;
+    EXPECT_EQ(0, metrics.GetFormNCM(-1));
+}
+
+TEST_F(GeometryTest, UnitsOfOtherHosts) {
+    processor.access = false;
+    const HostObject form = MakeObject("VBForm");
+    const HostObject control = MakeObject("TextBox", {{"Container", form}, {"Left", 60}, {"Top", 60}});
+    const std::vector<std::pair<double, double>> twips{
+        {1, 1}, {1, 1}, {20, 20}, {15, 15}, {120, 240}, {1440, 1440}, {56.69, 56.69}, {566.9, 566.9}};
+    for (std::size_t mode = 0; mode < twips.size(); ++mode) {
+        processor.scaleMode = static_cast<std::int32_t>(mode);
+        CScaler scaler;
+        scaler.Init(processor, form, control, /*vfAddContainers=*/true, false);
+        EXPECT_EQ(twips[mode], std::pair(scaler.ConstToMultiplyX(), scaler.ConstToMultiplyY())) << mode;
+        EXPECT_EQ(platform::access::RoundToEven(60 * twips[mode].first / 15), scaler.Left()) << mode;
+        EXPECT_EQ(platform::access::RoundToEven(60 * twips[mode].second / 15), scaler.Top()) << mode;
+    }
+}
+
+TEST_F(GeometryTest, TabsOfOtherHostsStandInRowsWithTheLastOnTop) {
+    processor.access = false;
+    processor.scaleMode = 1;
+    const auto property = [](std::int32_t value) {
+        return HostObject(MakeObject("Property", {{"Value", value}}));
+    };
+    const HostObject form = MakeObject("VBForm");
+    const auto tab = MakeObject("SSTab", {{"Container", form},
+                                          {"Left", 150},
+                                          {"Top", 300},
+                                          {"Width", 4500},
+                                          {"Height", 3000},
+                                          {"Properties(Tabs)", property(5)},
+                                          {"Properties(TabsPerRow)", property(3)},
+                                          {"Properties(TabHeight)", property(300)}});
+    CScaler scaler;
+    scaler.Init(processor, form, tab, /*vfAddContainers=*/true, /*vfCalcTabs=*/true);
+    EXPECT_EQ(5, scaler.TabsQTy());
+    EXPECT_EQ(100, scaler.TabWidth(0));
+    EXPECT_EQ(20, scaler.TabHeight(0));
+    EXPECT_EQ(20 + 20, scaler.TabTop(2)); // first row, below
+    EXPECT_EQ(20, scaler.TabTop(3));      // second row, on top
+    EXPECT_EQ(10 + 100, scaler.TabLeft(4));
+    tab->Set("Properties(TabsPerRow)", property(0));
+    scaler.Init(processor, form, tab, true, true);
+    EXPECT_EQ(0, scaler.TabIndexInRow(4));
+    EXPECT_EQ(20, scaler.TabTop(4));
 }
 
 TEST_F(GeometryTest, AFormIsReadOnceForAllItsControls) {
