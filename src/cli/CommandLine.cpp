@@ -36,6 +36,31 @@ void AddGenerate(CLI::App& app, Arguments& parsed, std::vector<std::string>& opt
     generate->callback([&] { parsed.command = Arguments::Command::Generate; });
 }
 
+void AddScreenshot(CLI::App& app, Arguments& parsed) {
+    using Kind = Arguments::ObjectKind;
+    auto* screenshot =
+        app.add_subcommand("screenshot", "retake the pictures of one form or report of a help");
+    screenshot->add_option("PROJECT", parsed.project, "project file (.tvp) of the help, or its folder")
+        ->required()
+        ->check(CLI::ExistingPath)
+        ->type_name("");
+    screenshot->add_option("OBJECT", parsed.object, "name of the form or report")->required()->type_name("");
+    auto* form = screenshot->add_flag_callback(
+        "--form", [&] { parsed.objectKind = Kind::Form; }, "the form, where a report has the same name");
+    screenshot
+        ->add_flag_callback(
+            "--report", [&] { parsed.objectKind = Kind::Report; },
+            "the report, where a form has the same name")
+        ->excludes(form);
+    screenshot->add_flag("--topic", parsed.topic, "write the topic anew too; the old one is kept beside it");
+    screenshot
+        ->add_option("--source", parsed.source,
+                     "the application, where it isn't at the place that is remembered for the project")
+        ->check(CLI::ExistingPath)
+        ->type_name("SOURCE");
+    screenshot->callback([&] { parsed.command = Arguments::Command::Screenshot; });
+}
+
 void AddList(CLI::App& app, Arguments& parsed) {
     auto* list = app.add_subcommand("list", "show the objects of an application by kind, with captions");
     list->add_option("SOURCE", parsed.source, kSource)->required()->check(CLI::ExistingPath)->type_name("");
@@ -72,6 +97,7 @@ Arguments ParseCommandLine(int count, const char* const* arguments) {
     app.set_version_flag("--version", std::string("tovimar ") + VersionText());
     app.require_subcommand(1);
     AddGenerate(app, parsed, options, noCompile);
+    AddScreenshot(app, parsed);
     AddList(app, parsed);
     app.add_subcommand("options", "show the options of a run with their defaults")->callback([&] {
         parsed.command = Arguments::Command::Options;

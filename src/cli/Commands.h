@@ -8,6 +8,7 @@ class Surroundings;
 
 /// Each gives the program's exit code and tells its failures itself.
 int Generate(const Arguments& arguments, Surroundings& surroundings);
+int RetakeScreenshot(const Arguments& arguments, Surroundings& surroundings);
 int List(const Arguments& arguments);
 int ShowOptions();
 

@@ -1,5 +1,6 @@
 #include "cli/Commands.h"
 #include "cli/Console.h"
+#include "cli/Stop.h"
 #include "cli/Surroundings.h"
 #include "foundation/CAddInProject.h"
 #include "foundation/CAddInSettingsXmlFile.h"
@@ -27,21 +28,6 @@ namespace tovimar::cli {
 namespace {
 
 namespace fs = std::filesystem;
-
-/// A reason to end the program with a message and an exit code.
-struct Stop {
-    std::string message;
-    int exitCode = kFailed;
-};
-
-void StopIfInterrupted() {
-    if (platform::InterruptRequested())
-        throw Stop{"interrupted", kInterrupted};
-}
-
-std::string FullPath(const std::string& native) {
-    return fs::weakly_canonical(fs::absolute(native)).string();
-}
 
 /// One command run: the steps in order, each stops the run by raising.
 class Generation {
@@ -223,33 +209,21 @@ int Generation::Judge(CTovimarActions::Outcome outcome) {
 }
 
 void Generation::ShowResult() const {
-    auto& files = *platform::Env().files;
-    const auto show = [&](const char* what, const std::string& path) {
-        if (!path.empty() && files.FileExists(path))
-            PrintResult(what + files.ToNative(path));
-    };
     const std::string compiled = Parameters().CompiledHelpFullPath();
     const std::string copied = CTovimarCompiler().GetCopiedHelpFullPath();
     if (Parameters().CompileHTMLHelp) {
-        show("Compiled help: ", compiled);
+        ShowFile("Compiled help: ", compiled);
         if (!text::EqualsIgnoringCase(compiled, copied))
-            show("Copied to:     ", copied);
+            ShowFile("Copied to:     ", copied);
     }
-    show("Web help:      ", Parameters().FolderForGeneratedHelp() + "main.htm");
-    show("Project:       ", Session::CurrentProject()->TvpFullPath());
+    ShowFile("Web help:      ", Parameters().FolderForGeneratedHelp() + "main.htm");
+    ShowFile("Project:       ", Session::CurrentProject()->TvpFullPath());
 }
 
 } // namespace
 
 int Generate(const Arguments& arguments, Surroundings& surroundings) {
-    try {
-        return Generation(arguments, surroundings).Run();
-    } catch (const Stop& stop) {
-        surroundings.Progress().Clear();
-        if (!stop.message.empty())
-            PrintError(NativePathsInText(stop.message));
-        return stop.exitCode;
-    }
+    return RunToStop(surroundings, [&] { return Generation(arguments, surroundings).Run(); });
 }
 
 } // namespace tovimar::cli

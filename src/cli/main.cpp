@@ -21,6 +21,8 @@ int Run(const Arguments& arguments) {
         switch (arguments.command) {
         case Arguments::Command::Generate:
             return Generate(arguments, surroundings);
+        case Arguments::Command::Screenshot:
+            return RetakeScreenshot(arguments, surroundings);
         case Arguments::Command::List:
             return List(arguments);
         default:

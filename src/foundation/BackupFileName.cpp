@@ -1,5 +1,6 @@
 #include "foundation/BackupFileName.h"
 
+#include "foundation/ErrorTrap.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 
@@ -18,6 +19,18 @@ std::string BackupFileName(const std::string& path) {
     for (int counter = 1; environment.files->FileExists(candidate); ++counter)
         candidate = base + std::to_string(counter) + extension;
     return candidate;
+}
+
+bool BackUpFile(const std::string& path) {
+    auto& files = *platform::Env().files;
+    if (!files.FileExists(path))
+        return true;
+    bool done = false;
+    PassOver([&] {
+        files.CopyFile(path, BackupFileName(path));
+        done = true;
+    });
+    return done;
 }
 
 } // namespace tovimar

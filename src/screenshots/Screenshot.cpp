@@ -1,15 +1,18 @@
 #include "screenshots/Screenshot.h"
 
+#include "foundation/BackupFileName.h"
 #include "foundation/ErrorTrap.h"
+#include "foundation/Product.h"
 #include "foundation/Session.h"
+#include "foundation/ShowMessage.h"
+#include "generation/CTovimar.h"
+#include "generation/RunProgress.h"
 #include "host/contract/ObjectTypes.h"
+#include "host/server/CTovimarServer.h"
 #include "host/server/CTovimarServerAgent.h"
-#include "host/server/CTovimarServerData.h"
 #include "platform/files/Paths.h"
-#include "platform/text/Text.h"
 #include "screenshots/CFormBitmapCapture.h"
-#include "screenshots/CaptureTrace.h"
-#include "uimodel/CXmlControl.h"
+#include "screenshots/ScreenshotRecord.h"
 #include "uimodel/CXmlForm.h"
 
 namespace tovimar {
@@ -17,160 +20,111 @@ namespace tovimar {
 namespace {
 
 constexpr const char* kClass = "Screenshot";
-constexpr ResultCode kNoTargetFolder = MakeResultCode(0x80040002U);
-constexpr ResultCode kNoPictureName = MakeResultCode(0x80040003U);
-
-std::int32_t ObjectTypeOf(const CXmlForm& form) {
-    return text::EqualsIgnoringCase(form.ClassName, "Report") ? ObjectType::kReport : ObjectType::kForm;
-}
-
-/// What a picture shows above its control, so that the title in the frame's line is seen. The topic's map
-/// counts it as well.
-std::int32_t TitleShare(const CXmlControl& control) {
-    if (control.IsClass("Frame") || control.IsClass("OptionGroup"))
-        return 8;
-    if (control.IsClass("TabControl") || control.IsClass("Page") || control.IsClass("SSTab"))
-        return 2;
-    return 0;
-}
-
-bool Runtime() {
-    const auto* data = Session::ServerData();
-    return data != nullptr && data->Runtime;
-}
-
-CTovimarServerAgent& Agent() {
-    auto* agent = Session::ServerAgent();
-    if (agent == nullptr)
-        throw RaisedError(kGeneralFailure, "There is no connection to a host.", kClass);
-    return *agent;
-}
-
-std::string InFolder(const std::string& folder, const std::string& path) {
-    return folder.empty() ? path : platform::Join(folder, platform::FileNameOf(path));
-}
 
 } // namespace
 
-/// One call's wishes, and what all its captures share.
-struct Screenshot::Request {
-    const std::string& picType;
-    const std::string& folder;
-    std::int32_t window;
-    const CXmlForm& form;
-    bool msAccess;
-    std::int32_t mainWindow; ///< only looked for where there is no window's handle
-};
+Screenshot::Screenshot() = default;
 
-ResultCode Screenshot::LocateObjectsAndTakeScreenshots(const std::string& vstrPicType, std::int32_t vlngHwnd,
-                                                       const std::string& vstrXml,
-                                                       const std::string& vstrPicsFolder) {
-    lastErrNum_ = Trapped(kClass, "LocateObjectsAndTakeScreenshots", [&] {
-        try {
-            TakeAll(vstrPicType, vlngHwnd, vstrXml, vstrPicsFolder);
-        } catch (const RaisedError& failure) {
-            lastErrDscr_ = failure.what();
-            throw;
-        }
-    });
-    if (lastErrNum_ == 0)
-        lastErrDscr_.clear();
-    return lastErrNum_;
-}
-
-void Screenshot::TakeAll(const std::string& vstrPicType, std::int32_t vlngHwnd, const std::string& vstrXml,
-                         const std::string& vstrPicsFolder) {
-    CXmlForm form;
-    if (const auto code = form.LoadXml(vstrXml); code != kSuccess)
-        throw RaisedError(code, "Error parsing XML form string",
-                          "Screenshot.LocateObjectsAndTakeScreenshots");
-    const auto type = ObjectTypeOf(form);
-    auto& agent = Agent();
-    const auto window = agent.ActivateComponent(type, form.Name, /*forceOpenInDesignView=*/false,
-                                                /*forceOpenAsHidden=*/false);
-    agent.CorrectInsideWidthAndHeigh(type, form.Name, /*designViewFlag=*/true);
-    const auto captured = vlngHwnd != 0 ? vlngHwnd : window;
-    const Request request{vstrPicType,
-                          vstrPicsFolder,
-                          captured,
-                          form,
-                          text::EqualsIgnoringCase(form.SourceProjectType, SourceProjectKind::kMSAccess),
-                          captured == 0 ? agent.HostAppMainWindowHWnd() : 0};
-    // The window gets its size back whatever happened.
-    try {
-        TakeForm(request, form);
-        const auto path = form.ClassName + "." + form.Name + ".";
-        for (const auto& control : form.Controls)
-            TakeControl(request, *control, path);
-    } catch (const RaisedError&) {
-        PassOver([&] { agent.ResetInsideWidthAndHeigh(type, form.Name, true); });
-        throw;
-    }
-    agent.ResetInsideWidthAndHeigh(type, form.Name, /*designViewFlag=*/true);
-}
-
-void Screenshot::TakeForm(const Request& request, CXmlForm& form) {
-    const auto own = form.PicFullPath();
-    if (own.empty())
-        return;
-    const auto path = InFolder(request.folder, own);
-    capture_trace::Line([&] {
-        return "TakeFormAndCompoundControlsScreenshots: Form = [" + form.Name + "], picFullPath = " + path;
-    });
-    if (CFormBitmapCapture().CaptureForm(request.picType, path, request.mainWindow, form.Caption(),
-                                         request.window, form.Width, form.Height))
-        takenImageFullPath_ = path;
-    form.SetPicFullPath(path);
-}
-
-void Screenshot::TakeControl(const Request& request, CXmlControl& control, const std::string& parentPath) {
-    auto path = parentPath + control.ControlType() + "." + control.Name;
-    if (control.IsClass("Page") && control.TabPageIndex >= 0)
-        path += ".[" + std::to_string(control.TabPageIndex) + "]";
-    TakeControlPicture(request, control);
-    for (const auto& child : control.Controls) {
-        if (text::EqualsIgnoringCase(child->ControlType(), "Page"))
-            Agent().ActivateControl(path + "." + child->ControlType() + "." + child->Name + ".[" +
-                                        std::to_string(child->TabPageIndex) + "]",
-                                    Runtime(), /*setFocusFlag=*/false);
-        TakeControl(request, *child, path + ".");
-    }
-    if (control.IsTabControl())
-        Agent().ActivateControl(path + ".Page." + control.Name + ".[0]", Runtime(), /*setFocusFlag=*/false);
-}
-
-void Screenshot::TakeControlPicture(const Request& request, CXmlControl& control) {
-    if (control.PicFullPath.empty())
-        return;
-    const auto path = InFolder(request.folder, control.PicFullPath);
-    const auto share = request.msAccess ? TitleShare(control) : 0;
-    CFormBitmapCapture().CaptureControl(request.picType, path, request.mainWindow, request.form.Caption(),
-                                        request.window, control.Left, control.Top - share, control.Width,
-                                        control.Height + share);
-    control.PicFullPath = path;
+Screenshot::~Screenshot() {
+    if (ownServer_)
+        ForgetServer();
 }
 
 ResultCode Screenshot::TakeWindowScreenshot(std::int32_t vlngHwnd, std::int32_t picType,
                                             const std::string& targetFolder,
                                             const std::string& picFileNameExt) {
-    if (picType != 1 && picType != 2)
-        return Fail(kFailure1, "Pictype can be only equal to 1(Bitmap) or 2(Jpeg)");
-    if (targetFolder.empty())
-        return Fail(kNoTargetFolder, "TargetFolder isn't specified");
-    if (picFileNameExt.empty())
-        return Fail(kNoPictureName, "Picture file name isn't specified");
-    takenImageFullPath_ = platform::Join(targetFolder, picFileNameExt);
-    if (!CFormBitmapCapture().CaptureWindowScreenshot(
-            vlngHwnd, picType == 1 ? modScreenCapture::kBmp : modScreenCapture::kJpg, takenImageFullPath_))
+    if (const auto code = CheckPlace(picType, targetFolder, picFileNameExt); code != kSuccess)
+        return code;
+    bool taken = false;
+    const auto failed = Guarded("TakeWindowScreenshot", [&] {
+        takenImageFullPath_ = platform::Join(targetFolder, picFileNameExt);
+        taken = CFormBitmapCapture().CaptureWindowScreenshot(
+            vlngHwnd, picType == 1 ? modScreenCapture::kBmp : modScreenCapture::kJpg, takenImageFullPath_);
+    });
+    if (failed == kSuccess && !taken)
         return Fail(kGeneralFailure, "Unexpected error whille taking window screenshot.");
-    lastErrDscr_.clear();
-    return lastErrNum_ = 0;
+    return failed;
+}
+
+std::unique_ptr<CXmlForm> Screenshot::TakePictures(const Shot& shot) {
+    auto& generator = *Session::Generator();
+    const auto& parameters = generator.Parameters();
+    const std::string folder = platform::FolderOf(shot.picFullPath);
+    const std::string picture = shot.picFullPath.empty() ? shot.picFullPath
+                                                         : folder + platform::BaseNameOf(shot.picFullPath) +
+                                                               parameters.ImagesFileExt();
+    auto form = generator.CreateNormalizedXmlDef(shot.objectType, shot.objectName, 0, shot.designView,
+                                                 /*vfReplaceHtml=*/false, parameters.ImagesFormat, picture,
+                                                 shot.htmlFullPath, parameters.CapturePreviewAreaOnly, {},
+                                                 /*vfKeepOpened=*/true);
+    // What kept the host from describing the object has been reported there.
+    if (form->Name.empty()) {
+        Fail(kFailure1, "There is no description of the object [" + shot.objectName + "].");
+        return nullptr;
+    }
+    if (LocateObjectsAndTakeScreenshots(parameters.ImagesType(), shot.window, form->XMLSTr(),
+                                        shot.picsFolder.empty() ? folder : shot.picsFolder) != kSuccess)
+        return nullptr;
+    return form;
+}
+
+ResultCode Screenshot::WriteTopic(CXmlForm& form, const Shot& shot, bool zoomed) {
+    const auto& parameters = *Session::Parameters();
+    if (form.StylesheetFullPath().empty())
+        form.SetStylesheetFullPath(parameters.CSSFullPath());
+    if (form.Charset.empty())
+        form.Charset = parameters.Charset;
+    if (shot.htmlFullPath.empty())
+        return kSuccess;
+    const std::string folder =
+        shot.picsFolder.empty() ? platform::FolderOf(shot.picFullPath) : shot.picsFolder;
+    return form.SaveHTMLEx(shot.htmlFullPath, /*HtmlOfReport=*/shot.objectType != ObjectType::kForm, zoomed,
+                           /*vfUseLocalImagePath=*/false, folder);
+}
+
+ResultCode Screenshot::TakeScreenshot(std::int32_t objectType, const std::string& objectName,
+                                      const std::string& picFullPath, const std::string& htmlFullPath,
+                                      bool vfIsVSNet, const std::string& picsFolder) {
+    ResultCode result = kSuccess;
+    const auto failed = Guarded("TakeScreenshot", [&] {
+        if (!vfIsVSNet && (objectName.empty() || !HostAgent().ComponentExistsTest(objectType, objectName)))
+            throw RaisedError(
+                kFailure1, "Undefined object type and name (" + std::to_string(objectType) + objectName + ")",
+                "Screenshot.TakeScreenshot");
+        Shot shot{objectType, objectName, picFullPath, htmlFullPath, picsFolder};
+        const auto form = TakePictures(shot);
+        if (form == nullptr) {
+            result = lastErrNum_;
+            return;
+        }
+        if (!htmlFullPath.empty() && !BackUpFile(htmlFullPath)) {
+            result = Fail(kFailure2, "Cannot backup active object's HTML file '" + htmlFullPath + "'.");
+            ShowMessage(lastErrDscr_, kMsgExclamation, kApplicationTitle, {}, 0, "Screenshot.TakeScreenshot");
+            return;
+        }
+        result = WriteTopic(*form, shot, /*zoomed=*/true);
+    });
+    return failed != kSuccess ? failed : result;
 }
 
 ResultCode Screenshot::Fail(ResultCode number, const std::string& text) {
     lastErrNum_ = number;
     lastErrDscr_ = text;
     return number;
+}
+
+ResultCode Screenshot::Guarded(const char* operation, const std::function<void()>& steps) {
+    Fail(kSuccess, {});
+    std::string text;
+    const auto failed = Trapped(kClass, operation, [&] {
+        try {
+            steps();
+        } catch (const std::exception& failure) {
+            text = failure.what();
+            throw;
+        }
+    });
+    return failed == kSuccess ? kSuccess : Fail(failed, text);
 }
 
 std::string Screenshot::LastErrStr() const {

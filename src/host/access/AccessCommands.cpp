@@ -2,6 +2,7 @@
 
 #include "host/access/AccessCatalogue.h"
 #include "host/access/CN_IDEAccContext.h"
+#include "host/access/clsScreenShotToolbar.h"
 #include "host/contract/ObjectTypes.h"
 #include "host/server/CXmlCommand.h"
 #include "platform/Error.h"
@@ -168,6 +169,12 @@ const std::unordered_map<std::string, Handler>& Handlers() {
         {"hostappmainwindowhwnd", Ask<&Context::HostAppMainWindowHWnd>},
         {"hideidewindows", Do<&Context::HideIDEWindows>},
         {"resetidewindows", Do<&Context::ResetIDEWindows>},
+        {"showtoolbar",
+         [](Context& c, CXmlCommand&) { clsScreenShotToolbar().Show(c.IDE(), clsScreenShotToolbar::kName); }},
+        {"deletetoolbar",
+         [](Context& c, CXmlCommand&) {
+             clsScreenShotToolbar().Delete(c.IDE(), clsScreenShotToolbar::kName);
+         }},
         {"unhidedbwindow", Do<&Context::UnhideDbWindow>},
         {"progressmeterinit",
          [](Context& c, CXmlCommand& cmd) {

@@ -2,14 +2,13 @@
 #include "foundation/ErrorTrap.h"
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
-#include "generation/CTovimar.h"
+#include "generation/CTovimarParameters.h"
 #include "host/access/AccessCatalogue.h"
 #include "host/access/AccessProject.h"
 #include "host/access/CN_IDEAccContext.h"
 #include "host/access/LateBound.h"
 #include "host/contract/ObjectTypes.h"
 #include "platform/Environment.h"
-#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 #include "platform/windowing/WindowSystem.h"
 #include "screenshots/CFormBitmapCapture.h"
@@ -71,31 +70,12 @@ std::string CN_IDEAccContext::ScreenshotDatamodelWindow() {
 
 void CN_IDEAccContext::TakeScreenshot(std::int32_t type, const std::string& name, const std::string& picPath,
                                       const std::string& htmlPath) {
-    CTovimar generator;
-    generator.SetParameters(Session::Parameters()->Clone());
-    const CTovimarParameters& parameters = generator.Parameters();
     const bool isReport = type != ObjectType::kForm;
     const HostObject open = late::Object(application_, isReport ? "Reports" : "Forms", {name});
-    const bool designView = !isReport && late::Integer(open, "currentview") == 0;
-    const std::string picture =
-        picPath.empty()
-            ? picPath
-            : platform::FolderOf(picPath) + platform::BaseNameOf(picPath) + parameters.ImagesFileExt();
-
-    const std::unique_ptr<CXmlForm> form = generator.CreateNormalizedXmlDef(
-        type, name, HostAppMainWindowHWnd(), designView, /*vfReplaceHtml=*/false, parameters.ImagesFormat,
-        picture, htmlPath, parameters.CapturePreviewAreaOnly, CurrentSourceProjectTypeName(),
-        /*vfKeepOpened=*/true);
-    if (!form || Screenshot().LocateObjectsAndTakeScreenshots(
-                     parameters.ImagesType(), late::Integer(open, "hWnd"), form->XMLSTr()) != kSuccess)
-        return;
-    if (form->StylesheetFullPath().empty())
-        form->SetStylesheetFullPath(parameters.CSSFullPath());
-    if (form->Charset.empty())
-        form->Charset = parameters.Charset;
-    if (!htmlPath.empty())
-        form->SaveHTMLEx(htmlPath, isReport, /*vfApplyZoomFactor=*/false, /*vfUseLocalImagePath=*/true,
-                         platform::FolderOf(picture));
+    Screenshot::Shot shot{type, name, picPath, htmlPath};
+    shot.designView = !isReport && late::Integer(open, "currentview") == 0;
+    if (const auto form = Screenshot().TakePictures(shot))
+        Screenshot::WriteTopic(*form, shot, /*zoomed=*/false);
 }
 
 } // namespace tovimar

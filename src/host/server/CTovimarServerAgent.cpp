@@ -233,6 +233,14 @@ void CTovimarServerAgent::ResetInsideWidthAndHeigh(std::int32_t objType, const s
     Send("ResetInsideWidthAndHeigh",
          {{"ObjType", objType}, {"ObjName", objName}, {"DesignViewFlag", designViewFlag}});
 }
+void CTovimarServerAgent::ShowToolbar(const std::string& toolbarName) {
+    Send("ShowToolbar", {{"ToolbarName", toolbarName}});
+}
+
+void CTovimarServerAgent::DeleteToolbar(const std::string& toolbarName) {
+    Send("DeleteToolbar", {{"ToolbarName", toolbarName}});
+}
+
 bool CTovimarServerAgent::TakeScreenshot(std::int32_t objType, const std::string& objName,
                                          const std::string& picFullPath, const std::string& htmlFullPath) {
     return AskBoolean("TakeScreenshot", {{"ObjType", objType},

@@ -80,6 +80,9 @@ public:
     bool ActivateControl(const std::string& controlFullPath, bool runtimeFlag, bool setFocusFlag);
     void CorrectInsideWidthAndHeigh(std::int32_t objType, const std::string& objName, bool designViewFlag);
     void ResetInsideWidthAndHeigh(std::int32_t objType, const std::string& objName, bool designViewFlag);
+    /// The toolbar of the screenshot tool in the host.
+    void ShowToolbar(const std::string& toolbarName);
+    void DeleteToolbar(const std::string& toolbarName);
     bool TakeScreenshot(std::int32_t objType, const std::string& objName, const std::string& picFullPath,
                         const std::string& htmlFullPath);
     bool IDEDisplayModelIsMDI();

@@ -4,6 +4,7 @@
 #include "platform/access/AccessSession.h"
 #include "platform/access/CodeObjects.h"
 #include "platform/access/Collections.h"
+#include "platform/access/CommandBars.h"
 #include "platform/access/DataObjects.h"
 #include "platform/access/ProjectObjects.h"
 #include "platform/access/WindowObject.h"
@@ -57,8 +58,7 @@ private:
     }
     Value ReadScreen(const Arguments&) { return ObjectValue(std::make_shared<ScreenObject>(session_)); }
     Value ReadCommandBars(const Arguments& arguments) {
-        const auto bars = MakeCommandBars();
-        return arguments.empty() ? ObjectValue(bars) : bars->Get("Item", arguments);
+        return arguments.empty() ? ObjectValue(commandBars_) : commandBars_->Get("Item", arguments);
     }
     Value ReadEditor(const Arguments&) { return ObjectValue(MakeCodeEditor(session_)); }
     Value ReadVersion(const Arguments&) { return "11.0"; }
@@ -73,6 +73,7 @@ private:
     Value OpenObjects(const char* className, ObjectKind kind, const Arguments& arguments);
 
     std::shared_ptr<AccessSession> session_;
+    HostObject commandBars_ = MakeCommandBars();
 };
 
 const MemberTable<ApplicationObject>& ApplicationObject::Members() {

@@ -211,28 +211,6 @@ private:
     SessionRef session_;
 };
 
-class CommandBar : public LateBound<CommandBar> {
-public:
-    explicit CommandBar(std::string name) : name_(std::move(name)) {}
-    std::string ClassName() const override { return "CommandBar"; }
-    static const MemberTable<CommandBar>& Members() {
-        static const MemberTable<CommandBar> kMembers{{"Name", &CommandBar::ReadName},
-                                                      {"Visible", &CommandBar::ReadVisible},
-                                                      {"Controls", &CommandBar::ReadControls}};
-        return kMembers;
-    }
-
-private:
-    Value ReadName(const Arguments&) { return name_; }
-    Value ReadVisible(const Arguments&) { return false; }
-    Value ReadControls(const Arguments& arguments) {
-        return ListOrItem(std::make_shared<CollectionObject>("CommandBarControls", 1, MissingEntry{}),
-                          arguments);
-    }
-
-    std::string name_;
-};
-
 } // namespace
 
 HostObject MakeProjectObject(const SessionRef& session) {
@@ -245,13 +223,6 @@ HostObject MakeDataObject(const SessionRef& session) {
 
 HostObject MakeCommandObject(const SessionRef& session) {
     return std::make_shared<CommandObject>(session);
-}
-
-HostObject MakeCommandBars() {
-    const auto bars = std::make_shared<CollectionObject>(
-        "CommandBars", 1, MissingEntry{5, "Invalid procedure call or argument"});
-    bars->Add("Menu bar", std::make_shared<CommandBar>("Menu bar"));
-    return bars;
 }
 
 } // namespace tovimar::platform::access

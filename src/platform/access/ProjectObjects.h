@@ -10,7 +10,5 @@ HostObject MakeProjectObject(const SessionRef& session);
 HostObject MakeDataObject(const SessionRef& session);
 /// `DoCmd`: opens, closes and selects objects.
 HostObject MakeCommandObject(const SessionRef& session);
-/// `CommandBars`: the menu bar, which has no controls.
-HostObject MakeCommandBars();
 
 } // namespace tovimar::platform::access
