@@ -45,7 +45,7 @@ std::string CFormHtmlTemplates::ControlArea(const std::string& vstrFrmName, cons
                                             const CXmlControl& rctl, const CXmlControl* rctlParent,
                                             bool IsTabArea) {
     return Written([&](std::string& out) {
-        TopicSections::AppendArea(out, vstrFrmName, rfrm, rctl, rctlParent, IsTabArea);
+        TopicSections(rfrm).AppendArea(out, vstrFrmName, rctl, rctlParent, IsTabArea);
     });
 }
 

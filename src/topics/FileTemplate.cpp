@@ -186,7 +186,8 @@ std::string CFormHtmlTemplates::FileTemplate(CXmlForm& robjXmlForm, bool vfMainI
             vfControls,
             vstrZoom,
             vstrQryXml,
-            TopicSections(robjXmlForm, {vfMainImage, vfControlsMap, vfUseLocalImagePath, vstrPicsDir})};
+            TopicSections(robjXmlForm, {vfMainImage, vfControlsMap, vfUseLocalImagePath, vstrPicsDir,
+                                        /*named=*/!vstrTemplateFile.empty()})};
         page = vstrTemplateFile.empty() ? BuiltInLayout(topic) : FilledTemplate(topic, vstrTemplateFile);
         Finish(page, robjXmlForm);
     });
