@@ -119,7 +119,8 @@ Tags DatamodelTags(CHelpPrjTreeNode& node, const CTovimarParameters& parameters)
     }
     const std::string file = "Datamodel" + parameters.ImagesFileExt();
     return {"{{DatamodelImage}}|<IMG SRC=\"" + parameters.NameOfFolderForGeneratedImagesWithSlash() + file +
-                "\" BORDER=0 " + ShownSize(parameters.FolderForGeneratedImages() + file, parameters) + "/>",
+                "\" BORDER=0 " + ShownSize(parameters.FolderForGeneratedImages() + file, parameters) +
+                "ALT=\"{{DatamodelCaption}}\" />",
             "{{Relationships}}|" + relations};
 }
 
@@ -274,6 +275,8 @@ void MakePrintedContents(CHelpPrjTreeNode& root, const CTovimarParameters& param
     const std::string contents = "<UL>" + root.ContentsHTML(1, true) + "</UL>\r\n";
     page.HTML = text::ReplaceAllIgnoringCase(page.HTML, "{{TOC}}", contents);
     page.HTML = Session::Messages()->ReplaceParameters(page.HTML);
+    // Saving puts the heading back as it was loaded.
+    page.Caption = Session::Messages()->ReplaceParameters(page.Caption);
     page.CSSFullPath = parameters.CSSFullPath();
     page.Save(parameters.FolderForGeneratedHelp() + parameters.HelpProjectName() + "TOC.htm");
 }
