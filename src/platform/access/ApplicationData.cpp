@@ -1,8 +1,10 @@
 #include "platform/Environment.h"
 #include "platform/Error.h"
 #include "platform/access/ApplicationModel.h"
+#include "platform/access/Datum.h"
 #include "platform/access/ExportReader.h"
 #include "platform/access/QueryReader.h"
+#include "platform/access/QueryRunner.h"
 #include "platform/access/TableReader.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
@@ -15,6 +17,8 @@ namespace tovimar::platform::access {
 namespace {
 
 constexpr int kMaxQueryDepth = 8;
+/// Of a table: enough for joins to find their partners, little enough for any table to be read.
+constexpr int kMostRows = 3000;
 
 std::string ReadText(const std::string& path) {
     return DecodeExportText(Env().files->ReadFile(path));
@@ -36,12 +40,25 @@ std::string CleanSource(const std::string& source) {
     return bracketed ? clean.substr(1, clean.size() - 2) : clean;
 }
 
-/// Cells of data files take the types of the table's fields.
+/// Cells of data files take the types of the table's fields and are spelled as those show.
 void TakeTypes(const TableDefinition& table, Records& records) {
-    for (auto& column : records.columns)
+    for (std::size_t i = 0; i < records.columns.size(); ++i) {
+        auto& column = records.columns[i];
         for (const auto& field : table.fields)
             if (text::EqualsIgnoringCase(field.name, column.name))
                 column.type = RecordType(field.type);
+        for (auto& cells : records.rows)
+            if (i < cells.size())
+                cells[i] = ReadableCell(cells[i], column.type);
+    }
+}
+
+Records FirstOf(const Records* records, int rows) {
+    if (records == nullptr)
+        return {};
+    const auto count = std::min(records->rows.size(), static_cast<std::size_t>(std::max(0, rows)));
+    return {records->columns,
+            {records->rows.begin(), records->rows.begin() + static_cast<std::ptrdiff_t>(count)}};
 }
 
 void TakeFields(const Records& records, TableDefinition& table) {
@@ -157,27 +174,33 @@ const std::vector<FieldDefinition>& ApplicationModel::QueryFields(const std::str
 
 const Records* ApplicationModel::FindRecords(const std::string& recordSource, int rows) {
     const auto source = CleanSource(recordSource);
-    if (source.empty())
-        return nullptr;
+    return source.empty() ? nullptr : KnownRecords(source, std::min(rows, kMostRows), 0);
+}
+
+/// Tables and queries are worked out once, however many forms and queries build on them.
+const Records* ApplicationModel::KnownRecords(const std::string& source, int rows, int depth) {
     const auto key = text::FoldCase(source) + "\n" + std::to_string(rows);
     const auto known = records_.find(key);
     if (known != records_.end())
         return known->second.get();
-    auto& kept = records_[key];
+    // A query that leads back to itself finds nothing here.
+    records_[key] = nullptr;
     try {
-        auto records = std::make_unique<Records>(ReadRecords(source, rows, 0));
+        auto records = std::make_unique<Records>(ReadRecords(source, rows, depth));
         if (!records->columns.empty())
-            kept = std::move(records);
+            records_[key] = std::move(records);
     } catch (const RaisedError&) {
-        kept = nullptr; // sample text stands in where the data can't be had
+        records_[key] = nullptr; // sample text stands in where the data can't be had
     }
-    return kept.get();
+    return records_[key].get();
 }
 
 Records ApplicationModel::ReadRecords(const std::string& source, int rows, int depth) {
     if (auto* table = tables_.Find(source)) {
         LoadTable(**table);
-        return TableRecords(**table, rows);
+        if (rows == kMostRows)
+            return TableRecords(**table);
+        return FirstOf(KnownRecords(source, kMostRows, depth), rows);
     }
     if (const auto* query = FindQuery(source))
         return QueryRecords(*query, QueryFields(source), rows, depth);
@@ -187,13 +210,13 @@ Records ApplicationModel::ReadRecords(const std::string& source, int rows, int d
     return QueryRecords(query, ResolveQueryFields(query, Sources()), rows, depth);
 }
 
-Records ApplicationModel::TableRecords(Table& table, int rows) {
+Records ApplicationModel::TableRecords(Table& table) {
     Records records;
     if (!table.dataPath.empty()) {
-        records = ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), rows);
+        records = ReadTableData(ReadText(table.dataPath), Env().files->ToNative(table.dataPath), kMostRows);
         TakeTypes(table.definition, records);
     } else if (!table.database.empty() && table.definition.connect.empty()) {
-        records = ReadTableRecords(table.database, table.definition.name, rows);
+        records = ReadTableRecords(table.database, table.definition.name, kMostRows);
     }
     if (records.columns.empty())
         for (const auto& field : table.definition.fields)
@@ -201,26 +224,18 @@ Records ApplicationModel::TableRecords(Table& table, int rows) {
     return records;
 }
 
-/// Rows only of a query that shows one source as it is: a record that the query wouldn't show is worse
-/// than sample text.
 Records ApplicationModel::QueryRecords(const QueryDefinition& query,
                                        const std::vector<FieldDefinition>& fields, int rows, int depth) {
+    if (depth < kMaxQueryDepth) {
+        auto records = RunQuery(
+            query, [&](const std::string& name) { return KnownRecords(name, kMostRows, depth + 1); }, rows);
+        if (records && !records->rows.empty())
+            return std::move(*records);
+    }
     Records records;
     for (const auto& field : fields)
         records.columns.push_back(
             {field.name, field.sourceField.empty() ? Records::Type::Unknown : RecordType(field.type)});
-    if (query.filtered || query.operation != 1 || query.inputs.size() != 1 || depth >= kMaxQueryDepth)
-        return records;
-    const auto source = ReadRecords(query.inputs[0].table, rows, depth + 1);
-    for (const auto& cells : source.rows) {
-        auto& row = records.rows.emplace_back();
-        for (const auto& field : fields) {
-            auto index = source.ColumnIndex(field.sourceField);
-            if (index < 0)
-                index = source.ColumnIndex(field.name);
-            row.push_back(index < 0 ? std::string() : cells[static_cast<std::size_t>(index)]);
-        }
-    }
     return records;
 }
 

@@ -112,7 +112,8 @@ private:
     void ReadQuery(Query& query);
     FieldSources Sources();
     Records ReadRecords(const std::string& recordSource, int rows, int depth);
-    Records TableRecords(Table& table, int rows);
+    const Records* KnownRecords(const std::string& source, int rows, int depth);
+    Records TableRecords(Table& table);
     Records QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields, int rows,
                          int depth);
 

@@ -72,6 +72,15 @@ struct QueryDefinition {
         std::string expression; ///< "Orders.Total", "Orders.*", "[a]+[b]"
         std::string alias;
     };
+    /// Conditions as they are written; an outer join keeps records without a partner.
+    struct Join {
+        std::string condition;
+        bool outer = false;
+    };
+    struct Sort {
+        std::string expression;
+        bool descending = false;
+    };
     std::string name;
     /// 1 select, 2 make-table, 3 append, 4 update, 5 delete, 6 crosstab, 7 data definition,
     /// 8 pass-through, 9 union.
@@ -80,7 +89,12 @@ struct QueryDefinition {
     std::vector<Input> inputs;
     std::vector<Column> columns;
     bool allFields = false; ///< every field of every input as well
-    bool filtered = false;  ///< has a condition, grouping, order or limit
+    std::vector<Join> joins;
+    std::string where; ///< empty for none
+    std::vector<std::string> groups;
+    std::vector<Sort> sorts;
+    bool distinct = false; ///< equal records count once
+    int top = 0;           ///< records at most, 0 for all
     NamedTexts properties;
 };
 

@@ -13,8 +13,10 @@ NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(TableDefinition, name, fields, indexes, conne
                                    properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Input, table, alias)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Column, expression, alias)
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition, name, operation, sql, inputs, columns, allFields,
-                                   filtered, properties)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Join, condition, outer)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Sort, expression, descending)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition, name, operation, sql, inputs, columns, allFields, joins,
+                                   where, groups, sorts, distinct, top, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(RelationDefinition, name, table, foreignTable, attributes, fields)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(NamedObject, kind, name, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(DatabaseContent, tables, queries, relations, names)

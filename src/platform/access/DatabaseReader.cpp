@@ -169,7 +169,7 @@ private:
             break;
         case 3:
             query.allFields = (row.Number("Flag") & 1) != 0;
-            query.filtered = query.filtered || (row.Number("Flag") & ~std::int64_t{1}) != 0;
+            query.distinct = (row.Number("Flag") & 2) != 0;
             break;
         case 5:
             TakeQueryInput(query, expression, first, row.Text("Name2"));
@@ -178,11 +178,17 @@ private:
             // An update's field stands behind its new value.
             query.columns.push_back({query.operation == 4 ? row.Text("Name2") : expression, first});
             break;
+        case 7:
+            query.joins.push_back({expression, row.Number("Flag") != 1});
+            break;
         case 8:
+            query.where = expression;
+            break;
         case 9:
-        case 10:
+            query.groups.push_back(expression);
+            break;
         case 11:
-            query.filtered = true;
+            query.sorts.push_back({expression, text::StartsWithIgnoringCase(first, "D")});
             break;
         default:
             break;
@@ -228,7 +234,8 @@ void CompleteQuery(QueryDefinition& query) {
     auto parsed = ParseQuerySql(query.sql);
     query.inputs = std::move(parsed.inputs);
     query.columns = std::move(parsed.columns);
-    query.filtered = true;
+    query.joins = std::move(parsed.joins);
+    query.where = std::move(parsed.where);
 }
 
 } // namespace

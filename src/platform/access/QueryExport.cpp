@@ -35,20 +35,47 @@ void ReadOutputColumns(const DesignObject& block, QueryDefinition& query) {
     }
 }
 
+/// One condition each; flag 1 keeps only records with a partner.
+void ReadJoins(const DesignObject& block, QueryDefinition& query) {
+    for (const auto& [name, value] : block.properties) {
+        if (text::EqualsIgnoringCase(name, "Expression"))
+            query.joins.push_back({value.text, false});
+        else if (text::EqualsIgnoringCase(name, "Flag") && !query.joins.empty())
+            query.joins.back().outer = value.text != "1";
+    }
+}
+
+/// Flag 1 is the falling order.
+void ReadSorts(const DesignObject& block, QueryDefinition& query) {
+    for (const auto& [name, value] : block.properties) {
+        if (text::EqualsIgnoringCase(name, "Expression"))
+            query.sorts.push_back({value.text, false});
+        else if (text::EqualsIgnoringCase(name, "Flag") && !query.sorts.empty())
+            query.sorts.back().descending = value.text == "1";
+    }
+}
+
 QueryDefinition ReadGrid(const DesignObject& root) {
-    constexpr int kAllFields = 1;
+    constexpr int kAllFields = 1, kDistinct = 2 | 8;
     QueryDefinition query;
     query.operation = root.Integer("Operation", 1);
     const int option = root.Integer("Option");
     query.allFields = (option & kAllFields) != 0;
-    query.filtered = (option & ~kAllFields) != 0 || root.FindOwn("Where") || root.FindOwn("Having");
+    query.distinct = (option & kDistinct) != 0;
+    query.where = root.FindOwn("Where") ? root.Text("Where") : std::string();
     for (const auto& block : root.children) {
         if (block->Is("InputTables"))
             ReadInputTables(*block, query);
         else if (block->Is("OutputColumns"))
             ReadOutputColumns(*block, query);
-        else if (block->Is("OrderBy") || block->Is("Groups"))
-            query.filtered = true;
+        else if (block->Is("Joins"))
+            ReadJoins(*block, query);
+        else if (block->Is("OrderBy"))
+            ReadSorts(*block, query);
+        else if (block->Is("Groups"))
+            for (const auto& [name, value] : block->properties)
+                if (text::EqualsIgnoringCase(name, "Expression"))
+                    query.groups.push_back(value.text);
     }
     return query;
 }

@@ -89,7 +89,32 @@ private:
         const auto from = std::min(FindOutside({"FROM"}, listEnd), end);
         const auto clause = std::min(FindOutside({"WHERE", "GROUP", "HAVING", "ORDER", "PIVOT"}, from), end);
         ReadInputs(std::min(from + 1, clause), clause);
-        query_.filtered = query_.filtered || clause < end || query_.operation == 9;
+        ReadClauses(clause, end);
+    }
+
+    /// WHERE, GROUP BY and ORDER BY; what a group must fulfil is left out.
+    void ReadClauses(std::size_t begin, std::size_t end) {
+        while (begin < end) {
+            const auto next =
+                std::min(FindOutside({"WHERE", "GROUP", "HAVING", "ORDER", "PIVOT"}, begin + 1), end);
+            auto last = next;
+            while (last > begin + 1 && tokens_[last - 1].IsSymbol(';'))
+                --last;
+            const bool listed = begin + 2 < last && tokens_[begin + 1].IsWord("BY");
+            if (tokens_[begin].IsWord("WHERE") && begin + 1 < last)
+                query_.where = Source(begin + 1, last);
+            else if (tokens_[begin].IsWord("GROUP") && listed)
+                ForEachPart(begin + 2, last,
+                            [&](auto from, auto to) { query_.groups.push_back(Source(from, to)); });
+            else if (tokens_[begin].IsWord("ORDER") && listed)
+                ForEachPart(begin + 2, last, [&](auto from, auto to) { AddSort(from, to); });
+            begin = next;
+        }
+    }
+
+    void AddSort(std::size_t begin, std::size_t end) {
+        const bool told = end - begin > 1 && IsAny(tokens_[end - 1], {"ASC", "DESC"});
+        query_.sorts.push_back({Source(begin, told ? end - 1 : end), tokens_[end - 1].IsWord("DESC")});
     }
 
     /// A statement may stand in parentheses as a whole: "(SELECT ...) UNION (SELECT ...)".
@@ -103,14 +128,20 @@ private:
     void SkipModifiers() {
         while (!AtEnd() && IsAny(Current(), {"ALL", "DISTINCT", "DISTINCTROW", "TOP", "PERCENT"})) {
             const bool top = At("TOP");
-            query_.filtered = true;
+            query_.distinct = query_.distinct || At("DISTINCT");
+            if (top && next_ + 1 < tokens_.size())
+                query_.top = std::clamp(std::atoi(tokens_[next_ + 1].text.c_str()), 0, 1'000'000);
             next_ += top ? 2 : 1;
         }
         next_ = std::min(next_, tokens_.size());
     }
 
-    /// Columns between two tokens, separated by commas outside of parentheses.
     void ReadColumns(std::size_t begin, std::size_t end) {
+        ForEachPart(begin, end, [&](auto from, auto to) { AddColumn(from, to); });
+    }
+
+    /// The parts between two tokens that commas outside of parentheses separate; none is empty.
+    template <typename Take> void ForEachPart(std::size_t begin, std::size_t end, const Take& take) {
         int depth = 0;
         auto start = begin;
         for (auto i = begin; i < end; ++i) {
@@ -119,16 +150,16 @@ private:
             else if (tokens_[i].IsSymbol(')'))
                 --depth;
             else if ((depth == 0 && tokens_[i].IsSymbol(',')) || tokens_[i].IsSymbol(';')) {
-                AddColumn(start, i);
+                if (start < i)
+                    take(start, i);
                 start = i + 1;
             }
         }
-        AddColumn(start, end);
+        if (start < end)
+            take(start, end);
     }
 
     void AddColumn(std::size_t begin, std::size_t end) {
-        if (begin >= end)
-            return;
         QueryDefinition::Column column;
         auto last = end;
         if (end - begin > 2 && tokens_[end - 2].IsWord("AS") && tokens_[end - 1].IsName()) {
@@ -157,10 +188,29 @@ private:
                 expectTable = true;
             } else if (token.IsWord("ON")) {
                 expectTable = false;
+                AddJoin(i, end);
             } else if (expectTable && token.IsName() && !IsJoinWord(token)) {
                 expectTable = AddInput(token.text, i, end);
             }
         }
+    }
+
+    /// The condition behind an ON, up to the next join or the parenthesis that closes this one.
+    void AddJoin(std::size_t on, std::size_t end) {
+        int depth = 0;
+        auto last = on + 1;
+        for (; last < end; ++last) {
+            depth += tokens_[last].IsSymbol('(') ? 1 : tokens_[last].IsSymbol(')') ? -1 : 0;
+            const bool over = tokens_[last].IsSymbol(',') || tokens_[last].IsSymbol(';') ||
+                              IsAny(tokens_[last], {"INNER", "LEFT", "RIGHT", "ON"});
+            if (depth < 0 || (depth == 0 && over))
+                break;
+        }
+        bool outer = false;
+        for (auto at = on; at > 0 && !outer && !IsAny(tokens_[at], {"INNER", "FROM"}); --at)
+            outer = IsAny(tokens_[at], {"LEFT", "RIGHT"});
+        if (last > on + 1)
+            query_.joins.push_back({Source(on + 1, last), outer});
     }
 
     static bool IsJoinWord(const SqlToken& token) {
@@ -213,7 +263,6 @@ private:
                 start = i + 1;
             }
         }
-        query_.filtered = true;
     }
 
     std::string_view sql_;

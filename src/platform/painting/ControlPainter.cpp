@@ -134,7 +134,8 @@ void ControlPainter::Write(const Object& control, const Rectangle& inner, const 
                   inner.top + Margin(control, "TopMargin", context_.metrics.twipsPerPixelY), inner.right,
                   inner.bottom};
     const int align = control.Integer("TextAlign", 0);
-    const bool right = align == 3 || (align == 0 && !context_.Designing() && sample_.AlignsRight(control));
+    const bool right =
+        align == 3 || (align == 0 && !context_.Designing() && sample_.AlignsRight(control, place_.row));
     place.align = align == 2 ? Align::Center : right ? Align::Right : Align::Left;
     place.wrap = multiline;
     auto style = StyleOf(control);

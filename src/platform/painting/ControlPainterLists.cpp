@@ -129,7 +129,7 @@ void ControlPainter::PaintSubform(const Object& control, const Rectangle& area) 
     canvas_.Fill(area, SystemColor::kWindow);
     {
         const ClipTo clip(canvas_, area);
-        PaintSourceObject(context_, control.Text("SourceObject"), area);
+        PaintSourceObject(context_, control.Text("SourceObject"), sample_.LinksOf(control, place_.row), area);
     }
     BorderLook look;
     look.effect = control.Integer("SpecialEffect", 0);

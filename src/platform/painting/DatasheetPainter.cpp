@@ -125,7 +125,7 @@ void ObjectPainter::PaintCell(const DesignObject& column, const Rectangle& cell,
     }
     DrawText(canvas_, sample_.Text(column, row), CellStyle(context_.design.root.get()),
              {{cell.left + 3, cell.top, cell.right - 3, cell.bottom},
-              sample_.AlignsRight(column) ? Align::Right : Align::Left,
+              sample_.AlignsRight(column, row) ? Align::Right : Align::Left,
               VerticalAlign::Middle});
 }
 
@@ -170,7 +170,8 @@ void ObjectPainter::PaintDatasheet(const Rectangle& area) {
     });
 }
 
-void PaintSourceObject(const PaintContext& outer, const std::string& sourceObject, const Rectangle& area) {
+void PaintSourceObject(const PaintContext& outer, const std::string& sourceObject,
+                       std::vector<RecordLink> links, const Rectangle& area) {
     if (sourceObject.empty() || outer.application == nullptr || outer.outer.size() + 1 >= kDeepestSubform)
         return;
     const auto source = SplitSource(sourceObject);
@@ -182,8 +183,8 @@ void PaintSourceObject(const PaintContext& outer, const std::string& sourceObjec
     if (design == nullptr || !design->root || itself)
         return;
     PaintContext context{
-        outer.canvas, outer.metrics, *design, outer.application, ViewWithin(outer.view, *design),
-        outer.pages,  outer.outer};
+        outer.canvas, outer.metrics, *design,         outer.application, ViewWithin(outer.view, *design),
+        outer.pages,  outer.outer,   std::move(links)};
     context.outer.push_back(&outer.design);
     ObjectPainter(context).Paint(area);
 }

@@ -84,13 +84,8 @@ Size DatasheetSize(const OpenObject& object, const SystemMetrics& metrics) {
 }
 
 Size PreviewSize(const OpenObject& object, const SystemMetrics& metrics) {
-    const auto source = object.design->root->Text("RecordSource");
-    const auto* records = object.application == nullptr || source.empty()
-                              ? nullptr
-                              : object.application->FindRecords(source, painting::SampleData::kMostRecords);
-    const int known =
-        records == nullptr || records->rows.empty() ? -1 : static_cast<int>(records->rows.size());
-    const auto page = painting::PlanReportPage(*object.design, known, metrics);
+    const painting::SampleData sample(*object.design, object.application);
+    const auto page = painting::PlanReportPage(*object.design, sample, metrics);
     return {page.width + 2 * painting::kDeskMargin, page.height + 2 * painting::kDeskMargin};
 }
 

@@ -49,6 +49,19 @@ int PrintOrder(int number) {
     }
 }
 
+bool IsBound(const DesignObject& control) {
+    const auto source = control.Text("ControlSource");
+    return (!source.empty() && !source.starts_with('=')) ||
+           std::any_of(control.children.begin(), control.children.end(),
+                       [](const auto& child) { return IsBound(*child); });
+}
+
+/// A form without records shows its detail once. Code may bring the records of bound controls.
+bool HasRecords(const Design& design) {
+    const auto* detail = design.Section(0);
+    return !design.root->Text("RecordSource").empty() || (detail != nullptr && IsBound(*detail));
+}
+
 std::string GroupField(const Design& design, int level) {
     int at = 0;
     for (const auto& child : design.root->children)
@@ -103,7 +116,7 @@ int NavigationHeight(const Design& design, const SystemMetrics& metrics) {
 }
 
 int ShownRecordsOf(const Design& design, View view, int insideHeight, const SystemMetrics& metrics) {
-    if (!IsContinuous(design, view))
+    if (!IsContinuous(design, view) || !HasRecords(design))
         return 1;
     const int detail = SectionPixels(design, 0, metrics);
     if (detail <= 0)

@@ -11,7 +11,7 @@ using access::View;
 
 ObjectPainter::ObjectPainter(const PaintContext& context)
     : context_(context), canvas_(context.canvas),
-      sample_(context.design, context.Designing() ? nullptr : context.application),
+      sample_(context.design, context.Designing() ? nullptr : context.application, context.links),
       frame_(access::ComputeFrame(context.metrics, FrameSettingsOf(context.design, context.view))) {}
 
 void ObjectPainter::Paint(const Rectangle& area) {
@@ -151,7 +151,7 @@ void ObjectPainter::PaintGrid(const Rectangle& area, Color ground) {
 
 void ObjectPainter::PaintPreview(const Rectangle& area) {
     canvas_.Fill(area, SystemColor::kDesk);
-    const auto page = PlanReportPage(context_.design, sample_.RecordCount(), context_.metrics);
+    const auto page = PlanReportPage(context_.design, sample_, context_.metrics);
     const Rectangle sheet{area.left + kDeskMargin, area.top + kDeskMargin,
                           area.left + kDeskMargin + page.width, area.top + kDeskMargin + page.height};
     canvas_.Fill(Moved(sheet, 3, 3), 0x808080);
@@ -163,13 +163,14 @@ void ObjectPainter::PaintPreview(const Rectangle& area) {
         const Rectangle place{left, top, left + width, top + section.height};
         const auto ground = GroundOf(*section.object, section.alternate);
         canvas_.Fill(place, ground);
+        sample_.LimitAggregates(section.firstAdded, section.added);
         PaintControls(*section.object, left, top, place, section.row, ground);
     }
 }
 
 void ObjectPainter::PaintPrintedBody(const Rectangle& area) {
     PaintFormBackground(area);
-    const auto page = PlanReportPage(context_.design, sample_.RecordCount(), context_.metrics);
+    const auto page = PlanReportPage(context_.design, sample_, context_.metrics);
     const auto* pageHeader = context_.design.Section(3);
     const auto* pageFooter = context_.design.Section(4);
     int top = area.top;
@@ -180,6 +181,7 @@ void ObjectPainter::PaintPrintedBody(const Rectangle& area) {
         const Rectangle place{area.left, top, area.right, top + section.height};
         const auto ground = GroundOf(*section.object, section.alternate);
         canvas_.Fill(place, ground);
+        sample_.LimitAggregates(section.firstAdded, section.added);
         PaintControls(*section.object, area.left, top, place, section.row, ground);
         top += section.height;
     }

@@ -40,6 +40,7 @@ private:
 
 /// Paints what a subform's `SourceObject` names; "Table." and "Query." give a datasheet. Nothing for an
 /// object that isn't known, lies too deep or would hold itself.
-void PaintSourceObject(const PaintContext& outer, const std::string& sourceObject, const Rectangle& area);
+void PaintSourceObject(const PaintContext& outer, const std::string& sourceObject,
+                       std::vector<RecordLink> links, const Rectangle& area);
 
 } // namespace tovimar::platform::painting

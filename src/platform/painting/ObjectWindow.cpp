@@ -74,7 +74,8 @@ private:
 
     void PaintClient(painting::Canvas& canvas) const {
         const painting::PaintContext context{
-            canvas, metrics_, *object_.design, object_.application, object_.view, &object_.currentPages, {}};
+            canvas, metrics_, *object_.design, object_.application, object_.view, &object_.currentPages,
+            {},     {}};
         painting::ObjectPainter(context).Paint(client);
     }
 

@@ -24,6 +24,8 @@ struct PaintContext {
     const std::map<const access::DesignObject*, int>* pages = nullptr;
     /// The designs around this one, the window's own first.
     std::vector<const access::Design*> outer;
+    /// What the records shown have in common with the record around them.
+    std::vector<RecordLink> links;
 
     bool Designing() const { return view == access::View::Design; }
     const std::vector<std::uint32_t>& Theme() const {

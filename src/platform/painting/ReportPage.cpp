@@ -1,6 +1,7 @@
 #include "platform/painting/ReportPage.h"
 
 #include "platform/painting/ObjectLayout.h"
+#include "platform/painting/SampleData.h"
 
 #include <algorithm>
 
@@ -15,6 +16,7 @@ constexpr int kDetailHeight = 300; ///< of all details printed
 /// A lower detail holds no text: a rule, or the room that something invisible takes.
 constexpr int kLeastDetail = 8;
 constexpr int kMostDetails = 14;
+constexpr int kGroupsHeight = 400; ///< of groups, at which no further one begins
 constexpr int kMostLevels = 10;
 constexpr int kLargestMargin = 56;
 constexpr int kUsualMargin = 40;
@@ -33,8 +35,8 @@ int MarginOf(const Design& design, std::size_t side, const SystemMetrics& metric
 
 class Planner {
 public:
-    Planner(const Design& design, int records, const SystemMetrics& metrics)
-        : design_(design), records_(records), metrics_(metrics) {}
+    Planner(const Design& design, const SampleData& sample, const SystemMetrics& metrics)
+        : design_(design), sample_(sample), records_(sample.RecordCount()), metrics_(metrics) {}
 
     ReportPage Plan() {
         page_.left = MarginOf(design_, 0, metrics_);
@@ -61,12 +63,28 @@ private:
         return PixelsOf(*section, "Height", metrics_.twipsPerPixelY);
     }
 
-    void Print(int number, int row) {
+    void Print(int number, int row, int firstAdded = 0, int added = 0) {
         const int height = Height(number);
         if (height <= 0)
             return;
-        page_.sections.push_back({design_.Section(number), top_, height, row, number == 0 && row % 2 == 1});
+        page_.sections.push_back(
+            {design_.Section(number), top_, height, row, number == 0 && row % 2 == 1, firstAdded, added});
         top_ += height;
+    }
+
+    /// Does a record belong to the group of the one before it?
+    bool SameGroup(int level, int row) const {
+        for (int outer = 0; outer <= level; ++outer)
+            if (sample_.GroupKey(outer, row) != sample_.GroupKey(outer, row - 1))
+                return false;
+        return true;
+    }
+
+    int EndOfGroup(int level, int row) const {
+        ++row;
+        while (row < records_ && SameGroup(level, row))
+            ++row;
+        return row;
     }
 
     void PrintGroups() {
@@ -74,22 +92,49 @@ private:
         int details = detail < kLeastDetail ? 1 : std::clamp(kDetailHeight / detail, 1, kMostDetails);
         if (records_ > 0)
             details = std::min(details, records_);
-        bool grouped = false;
+        int levels = 0;
         for (int level = 0; level < kMostLevels; ++level)
-            grouped = grouped || Height(5 + 2 * level) > 0 || Height(6 + 2 * level) > 0;
-        const int groups = grouped && details > 3 ? 2 : 1;
-        for (int group = 0, row = 0; group < groups; ++group) {
-            const int end = details * (group + 1) / groups;
-            for (int level = 0; level < kMostLevels; ++level)
-                Print(5 + 2 * level, row);
-            for (; row < end; ++row)
+            if (Height(5 + 2 * level) > 0 || Height(6 + 2 * level) > 0)
+                levels = level + 1;
+        PrintLevel(0, levels, 0, records_ < 0 ? details : records_, details);
+    }
+
+    bool BreaksPage(int number) const {
+        const auto* section = design_.Section(number);
+        return section != nullptr && section->Integer("ForceNewPage", 0) != 0;
+    }
+
+    /// Are so many groups of a level enough for this page?
+    bool IsFull(int level, int groups, int height) const {
+        const bool newPage = BreaksPage(5 + 2 * level) || BreaksPage(6 + 2 * level);
+        return (groups > 0 && newPage) || (groups > 1 && height >= kGroupsHeight);
+    }
+
+    /// Groups of a level one below the other within the records [row, end), about `room` details in all.
+    /// A long group is cut, so that its footer and the next group are seen.
+    void PrintLevel(int level, int levels, int row, int end, int room) {
+        if (level == levels) {
+            for (const int last = std::min(end, row + room); row < last; ++row)
                 Print(0, row);
-            for (int level = kMostLevels; level-- > 0;)
-                Print(6 + 2 * level, row - 1);
+            return;
+        }
+        const int share = std::max(1, room > 3 ? room / 2 : room);
+        const int start = top_;
+        for (int group = 0; row < end && room > 0 && !IsFull(level, group, top_ - start); ++group) {
+            const int next =
+                records_ < 0 ? std::min(end, row + share) : std::min(end, EndOfGroup(level, row));
+            // Without records a group's sums go over sample rows.
+            const int added = records_ < 0 ? 0 : next - row;
+            Print(5 + 2 * level, row, row, added);
+            PrintLevel(level + 1, levels, row, next, share);
+            Print(6 + 2 * level, next - 1, row, added);
+            room -= std::max(1, std::min(share, next - row));
+            row = next;
         }
     }
 
     const Design& design_;
+    const SampleData& sample_;
     int records_;
     const SystemMetrics& metrics_;
     ReportPage page_;
@@ -98,8 +143,8 @@ private:
 
 } // namespace
 
-ReportPage PlanReportPage(const Design& design, int records, const SystemMetrics& metrics) {
-    return Planner(design, records, metrics).Plan();
+ReportPage PlanReportPage(const Design& design, const SampleData& sample, const SystemMetrics& metrics) {
+    return Planner(design, sample, metrics).Plan();
 }
 
 } // namespace tovimar::platform::painting

@@ -13,6 +13,9 @@ struct PrintedSection {
     int height = 0;
     int row = 0; ///< record, from 0
     bool alternate = false;
+    /// Records that the sums of a group section go over; a count of 0 for all.
+    int firstAdded = 0;
+    int added = 0;
 };
 
 struct ReportPage {
@@ -22,8 +25,9 @@ struct ReportPage {
     std::vector<PrintedSection> sections;
 };
 
-/// `records` is the number of records at hand, below 0 when it isn't known.
-ReportPage PlanReportPage(const access::Design& design, int records, const SystemMetrics& metrics);
+class SampleData;
+ReportPage PlanReportPage(const access::Design& design, const SampleData& sample,
+                          const SystemMetrics& metrics);
 
 /// Grey ground around the sheet.
 inline constexpr int kDeskMargin = 14;

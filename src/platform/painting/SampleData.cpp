@@ -1,20 +1,23 @@
 #include "platform/painting/SampleData.h"
 
-#include "platform/painting/SampleExpression.h"
+#include "platform/painting/FieldName.h"
 #include "platform/painting/SampleText.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
 #include <charconv>
+#include <numeric>
 
 namespace tovimar::platform::painting {
 
+using access::Datum;
 using access::DesignObject;
 using access::Records;
 
 namespace {
 
 constexpr std::size_t kMostColumns = 64;
+constexpr std::size_t kMostListed = 200;
 
 bool IsValueList(const DesignObject& control) {
     return text::EqualsIgnoringCase(control.Text("RowSourceType"), "Value List");
@@ -82,87 +85,290 @@ bool IsCheck(const DesignObject& control) {
 
 } // namespace
 
-SampleData::SampleData(const access::Design& design, access::ApplicationSource* application)
-    : application_(application) {
+/// What expressions of an object's controls find around them.
+class SampleData::Scope : public access::ExpressionScope {
+public:
+    Scope(const SampleData& data, const DesignObject& control) : data_(data), control_(control) {}
+
+    std::optional<Datum> Value(const access::NamePath& name, int row) const override {
+        if (name.size() == 1)
+            return Named(name[0], row);
+        if (const auto value = InSubform(name))
+            return value;
+        const bool own =
+            text::EqualsIgnoringCase(name[0], "Me") ||
+            (name.size() > 2 && text::EqualsIgnoringCase(name[name.size() - 2], data_.design_.name));
+        return own || name.size() == 2 ? Named(name.back(), row) : data_.Guess(control_, name.back(), row);
+    }
+    int Rows() const override {
+        const int known = data_.RecordCount();
+        return known < 0 ? kSampleRows : data_.added_ > 0 ? std::min(data_.added_, known) : known;
+    }
+    int FirstRow() const override { return data_.firstAdded_; }
+    std::optional<Datum> LookUp(const std::string& function, const std::string& expression,
+                                const std::string& domain) const override;
+
+private:
+    static constexpr int kSampleRows = 4;
+    static constexpr int kDeepest = 4;
+
+    std::optional<Datum> Named(const std::string& name, int row) const {
+        if (auto value = data_.FieldValue(name, row))
+            return value;
+        if (text::EqualsIgnoringCase(name, "Page") || text::EqualsIgnoringCase(name, "Pages"))
+            return Datum::Number(1);
+        const auto* control = data_.FindControl(name);
+        if (control != nullptr && control != &control_ && data_.asked_ < kDeepest) {
+            ++data_.asked_;
+            auto value = data_.ValueOf(*control, row);
+            --data_.asked_;
+            return value;
+        }
+        return data_.Guess(control_, name, row);
+    }
+
+    /// "[Lines].[Form]![Total]": a control of the object that a subform shows.
+    std::optional<Datum> InSubform(const access::NamePath& name) const {
+        const auto* subform = data_.FindControl(name[name.size() > 2 ? name.size() - 3 : 0]);
+        if (subform == nullptr || !subform->Is("Subform") || data_.application_ == nullptr ||
+            data_.depth_ >= kDeepest)
+            return std::nullopt;
+        const auto source = subform->Text("SourceObject");
+        const auto* design =
+            data_.application_->FindDesign(data_.design_.kind, source.substr(source.find('.') + 1));
+        if (design == nullptr || !design->root)
+            return std::nullopt;
+        const SampleData inner(*design, data_.application_, data_.LinksOf(*subform, 0), data_.depth_ + 1);
+        const auto* control = inner.FindControl(name.back());
+        return control == nullptr ? inner.FieldValue(name.back(), 0)
+                                  : std::optional<Datum>(inner.ValueOf(*control, 0));
+    }
+
+    const SampleData& data_;
+    const DesignObject& control_;
+};
+
+namespace {
+
+/// All records of a table or query, for a function that looks into it.
+class DomainScope : public access::ExpressionScope {
+public:
+    explicit DomainScope(const Records& records) : records_(records) {}
+    std::optional<Datum> Value(const access::NamePath& name, int row) const override {
+        const int column = records_.ColumnIndex(name.back());
+        if (column < 0)
+            return std::nullopt;
+        const auto at = static_cast<std::size_t>(column);
+        const auto& cells = records_.rows[static_cast<std::size_t>(row)];
+        return at < cells.size() ? access::DatumOf(cells[at], records_.columns[at].type) : Datum{};
+    }
+    int Rows() const override { return static_cast<int>(records_.rows.size()); }
+
+private:
+    const Records& records_;
+};
+
+} // namespace
+
+std::optional<Datum> SampleData::Scope::LookUp(const std::string& function, const std::string& expression,
+                                               const std::string& domain) const {
+    const auto* records =
+        data_.application_ == nullptr ? nullptr : data_.application_->FindRecords(domain, kMostRecords);
+    const auto field = FieldName(expression);
+    if (records != nullptr && !records->rows.empty()) {
+        const auto single = function == "dlookup";
+        const auto asked =
+            access::Expression::Parse(single ? expression : function.substr(1) + "(" + expression + ")");
+        if (const auto value = asked ? asked->Evaluate(DomainScope(*records), 0) : std::nullopt)
+            return value;
+    }
+    if (function != "dlookup" || KindOf({}, field) != SampleKind::Text || HasSampleWords(field))
+        return data_.Guess(control_, field, 0);
+    return Datum::Text(SpacedName(field));
+}
+
+SampleData::SampleData(const access::Design& design, access::ApplicationSource* application,
+                       const std::vector<RecordLink>& links, int depth)
+    : design_(design), application_(application), depth_(depth) {
     if (application_ == nullptr || !design.root)
         return;
     const auto source = design.root->Text("RecordSource");
     if (!source.empty())
         records_ = application_->FindRecords(source, kMostRecords);
+    if (records_ == nullptr)
+        return;
+    KeepLinked(links);
+    if (design.kind == access::ObjectKind::Report)
+        SortByGroups();
+}
+
+void SampleData::KeepLinked(const std::vector<RecordLink>& links) {
+    const auto fulfils = [&](const std::vector<std::string>& cells) {
+        return std::all_of(links.begin(), links.end(), [&](const RecordLink& link) {
+            const int column = records_->ColumnIndex(FieldName(link.field));
+            return column < 0 ||
+                   (static_cast<std::size_t>(column) < cells.size() &&
+                    text::EqualsIgnoringCase(cells[static_cast<std::size_t>(column)], link.value));
+        });
+    };
+    for (std::size_t row = 0; row < records_->rows.size(); ++row)
+        if (fulfils(records_->rows[row]))
+            rows_.push_back(static_cast<int>(row));
+    for (std::size_t row = 0; rows_.empty() && row < records_->rows.size(); ++row)
+        rows_.resize(records_->rows.size()), std::iota(rows_.begin(), rows_.end(), 0);
+}
+
+std::string SampleData::GroupKey(int level, int row) const {
+    int at = 0;
+    for (const auto& child : design_.root->children)
+        if (child->Is("BreakLevel") && at++ == level)
+            return FieldValue(child->Text("ControlSource"), row).value_or(Datum{}).AsText();
+    return {};
+}
+
+/// A report prints its records in the order of its groups.
+void SampleData::SortByGroups() {
+    std::vector<std::pair<std::size_t, bool>> columns;
+    for (const auto& child : design_.root->children) {
+        const int column =
+            child->Is("BreakLevel") ? records_->ColumnIndex(FieldName(child->Text("ControlSource"))) : -1;
+        if (column >= 0)
+            columns.emplace_back(static_cast<std::size_t>(column), child->Flag("SortOrder"));
+    }
+    const auto cell = [&](int row, std::size_t column) {
+        const auto& cells = records_->rows[static_cast<std::size_t>(row)];
+        return column < cells.size() ? access::DatumOf(cells[column], records_->columns[column].type)
+                                     : Datum{};
+    };
+    std::stable_sort(rows_.begin(), rows_.end(), [&](int left, int right) {
+        for (const auto& [column, descending] : columns) {
+            const auto a = cell(left, column), b = cell(right, column);
+            const int order = a.IsNull() || b.IsNull()
+                                  ? static_cast<int>(b.IsNull()) - static_cast<int>(a.IsNull())
+                                  : -access::Compare(a, b).value_or(0);
+            if (order != 0)
+                return descending ? order < 0 : order > 0;
+        }
+        return false;
+    });
 }
 
 int SampleData::RecordCount() const {
-    if (records_ == nullptr || records_->rows.empty())
-        return -1;
-    return static_cast<int>(std::min<std::size_t>(records_->rows.size(), kMostRecords));
+    return rows_.empty() ? -1 : static_cast<int>(rows_.size());
 }
 
-std::string SampleData::FieldText(const DesignObject& control, std::string_view field, int row) const {
+void SampleData::LimitAggregates(int first, int count) {
+    firstAdded_ = first;
+    added_ = count;
+}
+
+std::vector<RecordLink> SampleData::LinksOf(const DesignObject& subform, int row) const {
+    std::vector<RecordLink> links;
+    const auto children = text::Split(subform.Text("LinkChildFields"), ";");
+    const auto masters = text::Split(subform.Text("LinkMasterFields"), ";");
+    for (std::size_t i = 0; i < children.size() && i < masters.size(); ++i) {
+        const auto field = FieldName(masters[i]);
+        auto value = FieldValue(field, row);
+        const auto* control = value ? nullptr : FindControl(field);
+        if (control != nullptr)
+            value = FieldValue(control->Text("ControlSource"), row);
+        if (value && !value->IsNull())
+            links.push_back({children[i], value->AsText()});
+    }
+    return links;
+}
+
+const DesignObject* SampleData::FindControl(std::string_view name) const {
+    std::vector<const DesignObject*> open;
+    for (const auto& section : design_.Sections())
+        open.push_back(section.object);
+    while (!open.empty()) {
+        const auto* object = open.back();
+        open.pop_back();
+        for (const auto& child : object->children) {
+            if (text::EqualsIgnoringCase(child->name, name))
+                return child.get();
+            open.push_back(child.get());
+        }
+    }
+    return nullptr;
+}
+
+std::optional<Datum> SampleData::FieldValue(std::string_view field, int row) const {
+    const int column = rows_.empty() ? -1 : records_->ColumnIndex(FieldName(field));
+    if (column < 0)
+        return std::nullopt;
+    const auto at = static_cast<std::size_t>(column);
+    const auto type = records_->columns[at].type;
+    if (type == Records::Type::Unknown)
+        return std::nullopt;
+    const int number = rows_[static_cast<std::size_t>(std::max(0, row)) % rows_.size()];
+    const auto& cells = records_->rows[static_cast<std::size_t>(number)];
+    return at < cells.size() ? access::DatumOf(cells[at], type) : Datum{};
+}
+
+Datum SampleData::Guess(const DesignObject& control, std::string_view field, int row) const {
     const auto name = FieldName(field);
     const auto format = control.Text("Format");
     const int column = records_ == nullptr ? -1 : records_->ColumnIndex(name);
-    if (column >= 0 && !records_->rows.empty()) {
-        const auto& cells =
-            records_->rows[static_cast<std::size_t>(std::max(0, row)) % records_->rows.size()];
-        const auto at = static_cast<std::size_t>(column);
-        return at < cells.size() ? Formatted(cells[at], format) : std::string();
-    }
     auto kind = KindOf(format, name);
-    if (column >= 0) {
-        switch (records_->columns[static_cast<std::size_t>(column)].type) {
-        case Records::Type::Number:
-            kind = SampleKind::Number;
-            break;
-        case Records::Type::Currency:
-            kind = SampleKind::Money;
-            break;
-        case Records::Type::DateTime:
-            kind = SampleKind::Date;
-            break;
-        case Records::Type::Boolean:
-            kind = SampleKind::Boolean;
-            break;
-        default:
-            break;
-        }
-    }
+    auto type =
+        column < 0 ? Records::Type::Unknown : records_->columns[static_cast<std::size_t>(column)].type;
+    if (type == Records::Type::Number)
+        kind = SampleKind::Number;
+    else if (type == Records::Type::Currency)
+        kind = SampleKind::Money;
+    else if (type == Records::Type::DateTime)
+        kind = SampleKind::Date;
+    else if (type == Records::Type::Boolean)
+        kind = SampleKind::Boolean;
     // Words don't fit into a box made for a figure or two.
     constexpr int kNarrowBox = 850;
     if (kind == SampleKind::Text && !HasSampleWords(name) && control.Integer("Width", 0) < kNarrowBox)
-        return std::to_string(row % 4 + 1);
-    return SampleText(kind, format, name, row);
+        return Datum::Number(row % 4 + 1);
+    const auto text = SampleText(kind, format, name, row);
+    if (kind == SampleKind::Number || kind == SampleKind::Money)
+        type = kind == SampleKind::Money ? Records::Type::Currency : Records::Type::Number;
+    else
+        type = kind == SampleKind::Date ? Records::Type::DateTime : Records::Type::Text;
+    return access::DatumOf(text, type);
 }
 
-std::string SampleData::Expression(const DesignObject& control, std::string_view expression, int row) const {
-    const auto format = control.Text("Format");
-    const auto joined =
-        JoinExpression(expression, [&](std::string_view field) { return FieldText(control, field, row); });
-    if (joined)
-        return Formatted(*joined, format);
-    if (IsAggregate(expression))
-        return SampleText(SampleKind::Number, format, "", row);
-    const auto field = LookedUpField(expression);
-    if (!field.empty() && KindOf(format, field) == SampleKind::Text && !HasSampleWords(field))
-        return SpacedName(field);
-    const auto& name = field.empty() ? control.name : field;
-    return SampleText(KindOf(format, name), format, name, row);
+Datum SampleData::Calculated(const DesignObject& control, std::string_view expression, int row) const {
+    const auto parsed = access::Expression::Parse(expression);
+    if (auto value = parsed ? parsed->Evaluate(Scope(*this, control), row) : std::nullopt)
+        return *value;
+    return Guess(control, parsed && parsed->HasAggregate() ? "count" : control.name, row);
+}
+
+Datum SampleData::ValueOf(const DesignObject& control, int row) const {
+    const auto source = control.Text("ControlSource");
+    if (source == "=1" && control.Integer("RunningSum", 0) != 0)
+        return Datum::Number(row + 1);
+    if (source.starts_with('='))
+        return Calculated(control, std::string_view(source).substr(1), row);
+    if (!source.empty()) {
+        auto value = FieldValue(source, row);
+        return value ? std::move(*value) : Guess(control, source, row);
+    }
+    const auto standard = control.Text("DefaultValue");
+    const auto parsed = access::Expression::Parse(standard.starts_with('=') ? standard.substr(1) : standard);
+    // A default that asks around belongs to a new record.
+    if (standard.empty() || standard.find('[') != std::string::npos || !parsed)
+        return {};
+    return parsed->Evaluate(Scope(*this, control), row).value_or(Datum{});
 }
 
 std::string SampleData::Text(const DesignObject& control, int row) const {
-    const auto source = control.Text("ControlSource");
-    if (source == "=1" && control.Integer("RunningSum", 0) != 0)
-        return std::to_string(row + 1);
-    if (source.empty()) {
-        const auto standard = control.Text("DefaultValue");
-        if (standard.find('(') != std::string::npos || standard.find('[') != std::string::npos)
-            return {};
-        const auto value = WithoutQuotes(standard);
-        return control.Is("ComboBox") && !value.empty() ? LookedUp(control, value, row) : value;
+    const auto value = ValueOf(control, row);
+    if (control.Is("ComboBox")) {
+        const auto source = control.Text("ControlSource");
+        const bool known = source.empty() || FieldValue(source, row).has_value();
+        return value.IsNull()
+                   ? std::string()
+                   : LookedUp(control, access::FormatDatum(value, control.Text("Format")), row, known);
     }
-    if (source.starts_with('='))
-        return Expression(control, std::string_view(source).substr(1), row);
-    const auto value = FieldText(control, source, row);
-    return control.Is("ComboBox") ? LookedUp(control, value, row) : value;
+    return access::FormatDatum(value, control.Text("Format"));
 }
 
 const Records* SampleData::RowSource(const DesignObject& control) const {
@@ -174,7 +380,9 @@ const Records* SampleData::RowSource(const DesignObject& control) const {
 }
 
 /// What a combo box shows for a value: the column shown of the row whose bound column holds the value.
-std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value, int row) const {
+/// A value that is known and isn't in the list shows nothing.
+std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value, int row,
+                                 bool known) const {
     const auto widths = ColumnWidths(combo, ColumnCount(combo));
     const auto shown = ShownColumn(widths);
     const auto bound = static_cast<std::size_t>(std::max(1, combo.Integer("BoundColumn", 1))) - 1;
@@ -190,8 +398,10 @@ std::string SampleData::LookedUp(const DesignObject& combo, const std::string& v
     const auto* records = RowSource(combo);
     if (records != nullptr && !records->rows.empty()) {
         for (const auto& cells : records->rows)
-            if (bound < cells.size() && shown < cells.size() && cells[bound] == value)
+            if (bound < cells.size() && shown < cells.size() && text::EqualsIgnoringCase(cells[bound], value))
                 return cells[shown];
+        if (known)
+            return {};
         const auto& cells = records->rows[static_cast<std::size_t>(std::max(0, row)) % records->rows.size()];
         return shown < cells.size() ? cells[shown] : std::string();
     }
@@ -204,36 +414,24 @@ bool SampleData::Checked(const DesignObject& control, int row) const {
     const auto source = control.Text("ControlSource");
     if (source.empty())
         return IsTrueWord(WithoutQuotes(control.Text("DefaultValue")));
-    const int column = records_ == nullptr ? -1 : records_->ColumnIndex(FieldName(source));
-    if (column >= 0 && !records_->rows.empty())
-        return IsTrueWord(FieldText(control, source, row));
-    return row % 2 == 0;
+    if (source.starts_with('='))
+        return ValueOf(control, row).IsTrue();
+    const auto value = FieldValue(source, row);
+    return value ? value->IsTrue() : row % 2 == 0;
 }
 
 std::string SampleData::GroupValue(const DesignObject& group, int row) const {
     const auto source = group.Text("ControlSource");
-    if (!source.empty() && !source.starts_with('=') && records_ != nullptr &&
-        records_->ColumnIndex(FieldName(source)) >= 0 && !records_->rows.empty())
-        return FieldText(group, source, row);
+    if (const auto value = source.empty() ? std::nullopt : FieldValue(source, row))
+        return value->kind == Datum::Kind::Boolean ? (value->IsTrue() ? "-1" : "0") : value->AsText();
     return WithoutQuotes(group.Text("DefaultValue", source.empty() ? "" : "1"));
 }
 
-bool SampleData::AlignsRight(const DesignObject& control) const {
-    if (IsCheck(control))
+bool SampleData::AlignsRight(const DesignObject& control, int row) const {
+    if (IsCheck(control) || control.Is("ComboBox") || control.Text("ControlSource").empty())
         return false;
-    const auto source = control.Text("ControlSource");
-    if (source.empty() || control.Is("ComboBox"))
-        return false;
-    const int column =
-        records_ == nullptr || source.starts_with('=') ? -1 : records_->ColumnIndex(FieldName(source));
-    if (column >= 0) {
-        const auto type = records_->columns[static_cast<std::size_t>(column)].type;
-        return type == Records::Type::Number || type == Records::Type::Currency ||
-               type == Records::Type::DateTime;
-    }
-    const auto kind = KindOf(control.Text("Format"),
-                             source.starts_with('=') ? std::string_view() : std::string_view(source));
-    return kind == SampleKind::Number || kind == SampleKind::Money || kind == SampleKind::Date;
+    const auto kind = ValueOf(control, row).kind;
+    return kind == Datum::Kind::Number || kind == Datum::Kind::Date;
 }
 
 SampleData::List SampleData::ListRows(const DesignObject& control) const {
@@ -243,7 +441,7 @@ SampleData::List SampleData::ListRows(const DesignObject& control) const {
     list.heads = control.Flag("ColumnHeads");
     if (IsValueList(control)) {
         const auto values = SplitValues(control.Text("RowSource"));
-        for (std::size_t at = 0; at < values.size() && list.rows.size() < kMostRecords; at += columns) {
+        for (std::size_t at = 0; at < values.size() && list.rows.size() < kMostListed; at += columns) {
             const auto end = std::min(values.size(), at + columns);
             list.rows.emplace_back(values.begin() + static_cast<std::ptrdiff_t>(at),
                                    values.begin() + static_cast<std::ptrdiff_t>(end));
@@ -264,8 +462,9 @@ SampleData::List SampleData::ListRows(const DesignObject& control) const {
             heads.push_back(records->columns[i].name);
     }
     for (const auto& cells : records->rows)
-        list.rows.emplace_back(cells.begin(),
-                               cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
+        if (list.rows.size() < kMostListed)
+            list.rows.emplace_back(
+                cells.begin(), cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
     if (records->rows.empty())
         for (int row = 0; row < 4; ++row) {
             auto& cells = list.rows.emplace_back();

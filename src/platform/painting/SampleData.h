@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/access/Expression.h"
 #include "platform/access/OpenObject.h"
 
 #include <string>
@@ -9,13 +10,28 @@
 /// What the controls of one object show: the first records where they are at hand, else sample text.
 namespace tovimar::platform::painting {
 
+/// A subform shows the records whose field holds a value of the record around it.
+struct RecordLink {
+    std::string field;
+    std::string value;
+};
+
 class SampleData {
 public:
-    /// `application` may be null.
-    SampleData(const access::Design& design, access::ApplicationSource* application);
+    /// `application` may be null. Links that no record fulfils are left out of account: a subform with the
+    /// wrong records tells more than an empty one. `depth` counts the objects that ask for each other's
+    /// values.
+    SampleData(const access::Design& design, access::ApplicationSource* application,
+               const std::vector<RecordLink>& links = {}, int depth = 0);
 
     /// Number of records at hand (at most `kMostRecords`), -1 when they can't be had.
     int RecordCount() const;
+    /// Aggregates go over `count` records from `first` on, over all with a count of 0.
+    void LimitAggregates(int first, int count);
+    /// The text that tells the groups of a report apart at a level from 0; empty without a group there.
+    std::string GroupKey(int level, int row) const;
+    /// Values of the fields that link a subform's records to this one's; none when one isn't known.
+    std::vector<RecordLink> LinksOf(const access::DesignObject& subform, int row) const;
     /// Text of a text box, combo box or label bound to something, in the record `row` (from 0).
     std::string Text(const access::DesignObject& control, int row) const;
     /// State of a check box, option button or toggle button.
@@ -23,7 +39,7 @@ public:
     /// The option that a group shows as chosen.
     std::string GroupValue(const access::DesignObject& group, int row) const;
     /// Is the content set to the right where the design leaves that to the host?
-    bool AlignsRight(const access::DesignObject& control) const;
+    bool AlignsRight(const access::DesignObject& control, int row) const;
     /// Rows of a list, each cut to the columns shown; the first one is the heads where the list has them.
     struct List {
         std::vector<std::vector<std::string>> rows;
@@ -32,16 +48,31 @@ public:
     };
     List ListRows(const access::DesignObject& control) const;
 
-    static constexpr int kMostRecords = 25;
+    static constexpr int kMostRecords = 1000;
 
 private:
-    std::string FieldText(const access::DesignObject& control, std::string_view field, int row) const;
-    std::string Expression(const access::DesignObject& control, std::string_view expression, int row) const;
-    std::string LookedUp(const access::DesignObject& combo, const std::string& value, int row) const;
-    const access::Records* RowSource(const access::DesignObject& control) const;
+    class Scope;
 
+    /// The record's value; none where the records or the field aren't at hand.
+    std::optional<access::Datum> FieldValue(std::string_view field, int row) const;
+    /// Sample text for a field that isn't at hand.
+    access::Datum Guess(const access::DesignObject& control, std::string_view field, int row) const;
+    access::Datum ValueOf(const access::DesignObject& control, int row) const;
+    access::Datum Calculated(const access::DesignObject& control, std::string_view expression, int row) const;
+    std::string LookedUp(const access::DesignObject& combo, const std::string& value, int row,
+                         bool known) const;
+    const access::Records* RowSource(const access::DesignObject& control) const;
+    const access::DesignObject* FindControl(std::string_view name) const;
+    void KeepLinked(const std::vector<RecordLink>& links);
+    void SortByGroups();
+
+    const access::Design& design_;
     access::ApplicationSource* application_;
     const access::Records* records_ = nullptr;
+    std::vector<int> rows_; ///< numbers of the records shown, in their order
+    int firstAdded_ = 0, added_ = 0;
+    int depth_;
+    mutable int asked_ = 0; ///< controls that are asking for each other's values
 };
 
 } // namespace tovimar::platform::painting

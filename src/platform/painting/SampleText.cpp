@@ -59,7 +59,7 @@ constexpr std::array<Hint, 44> kHints{{
     {"date", SampleKind::Date, {"3/14/2024", "4/2/2024", "5/23/2024", "6/9/2024"}},
     {"time", SampleKind::Text, {"9:30 AM", "10:15 AM", "1:45 PM", "3:00 PM"}},
     {"price", SampleKind::Money, {"24.50", "12.90", "149.00", "8.75"}},
-    {"amount", SampleKind::Money, {"240.00", "95.50", "1,120.00", "38.20"}},
+    {"amount", SampleKind::Money, {"240.00", "95.50", "1120.00", "38.20"}},
     {"cost", SampleKind::Money, {"18.40", "9.95", "110.00", "6.10"}},
     {"total", SampleKind::Number, {"124", "87", "203", "56"}},
     {"points", SampleKind::Number, {"12", "8", "5", "3"}},
@@ -97,38 +97,6 @@ bool Is(std::string_view format, std::string_view name) {
     return text::EqualsIgnoringCase(format, name);
 }
 
-/// "1234567.5" with two decimals and separators.
-std::string WithSeparators(double value, int decimals) {
-    std::array<char, 64> buffer{};
-    std::snprintf(buffer.data(), buffer.size(), "%.*f", decimals, std::fabs(value));
-    std::string digits(buffer.data());
-    auto whole = digits.find('.');
-    if (whole == std::string::npos)
-        whole = digits.size();
-    for (auto at = whole; at > 3; at -= 3)
-        digits.insert(at - 3, at - 3 == 0 ? "" : ",");
-    return (value < 0 ? "-" : "") + digits;
-}
-
-std::string FormattedNumber(double value, std::string_view format, const std::string& text) {
-    if (Is(format, "Currency"))
-        return (value < 0 ? "-$" : "$") + WithSeparators(std::fabs(value), 2);
-    if (Is(format, "Standard"))
-        return WithSeparators(value, 2);
-    if (Is(format, "Percent"))
-        return WithSeparators(value * 100, 2) + "%";
-    if (Is(format, "Fixed")) {
-        auto fixed = WithSeparators(value, 2);
-        std::erase(fixed, ',');
-        return fixed;
-    }
-    if (Is(format, "Yes/No"))
-        return value != 0 ? "Yes" : "No";
-    if (Is(format, "True/False"))
-        return value != 0 ? "True" : "False";
-    return text;
-}
-
 } // namespace
 
 SampleKind KindOf(std::string_view format, std::string_view fieldName) {
@@ -159,10 +127,10 @@ std::string SampleText(SampleKind kind, std::string_view format, std::string_vie
     switch (kind) {
     case SampleKind::Number: {
         static constexpr Words kNumbers{"12", "7", "31", "9"};
-        return Is(format, "Percent") ? "25%" : Formatted(std::string(kNumbers[at]), format);
+        return std::string(Is(format, "Percent") ? "0.25" : kNumbers[at]);
     }
     case SampleKind::Money: {
-        static constexpr Words kMoney{"$24.50", "$12.90", "$149.00", "$8.75"};
+        static constexpr Words kMoney{"24.50", "12.90", "149.00", "8.75"};
         return std::string(kMoney[at]);
     }
     case SampleKind::Date: {
@@ -175,16 +143,6 @@ std::string SampleText(SampleKind kind, std::string_view format, std::string_vie
         break;
     }
     return std::string(kPlainWords[at]);
-}
-
-std::string Formatted(const std::string& text, std::string_view format) {
-    if (format.empty() || text.empty())
-        return text;
-    double value = 0;
-    const auto result = std::from_chars(text.data(), text.data() + text.size(), value);
-    if (result.ec != std::errc() || result.ptr != text.data() + text.size())
-        return text;
-    return FormattedNumber(value, format, text);
 }
 
 } // namespace tovimar::platform::painting

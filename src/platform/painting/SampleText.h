@@ -14,11 +14,7 @@ SampleKind KindOf(std::string_view format, std::string_view fieldName);
 /// Is there sample text that fits a field of that name?
 bool HasSampleWords(std::string_view fieldName);
 
-/// Content of a field in the row `row` (from 0).
+/// Content of a field in the row `row` (from 0), without its format.
 std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row);
-
-/// A number's or date's text in one of the host's named formats ("Currency", "Short Date", "Percent", ...);
-/// other formats leave it as it is.
-std::string Formatted(const std::string& text, std::string_view format);
 
 } // namespace tovimar::platform::painting

@@ -133,7 +133,8 @@ TEST_F(ApplicationTest, GivesRecordsOfTablesAndPlainQueries) {
     EXPECT_EQ(table->columns[1].type, Records::Type::Boolean);
     EXPECT_EQ(model.FindRecords("SELECT note AS n, id FROM T;", 5)->rows[1],
               (std::vector<std::string>{"second", "2"}));
-    EXPECT_TRUE(model.FindRecords("SELECT note FROM T WHERE id=2", 5)->rows.empty());
+    EXPECT_EQ(model.FindRecords("SELECT note FROM T WHERE id=2", 5)->rows,
+              (std::vector<std::vector<std::string>>{{"second"}}));
     EXPECT_EQ(model.FindRecords("Bare", 5)->columns[0].type, Records::Type::DateTime);
     EXPECT_EQ(model.FindRecords("Nowhere", 5), nullptr);
     EXPECT_EQ(model.FindRecords("", 5), nullptr);

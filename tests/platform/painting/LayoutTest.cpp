@@ -131,6 +131,7 @@ TEST(Layout, AContinuousFormCountsItsRecords) {
     const auto& form = application.AddForm("F", R"(Begin Form
     NavigationButtons = NotDefault
     DefaultView =1
+    RecordSource ="Orders"
     Begin
         Begin Section
             Height =310

@@ -254,7 +254,7 @@ TEST(Paint, BoundControlsShowTheFirstRecord) {
     EXPECT_EQ(sample.RecordCount(), 2);
     EXPECT_EQ(sample.Text(control("C"), 0), "Miller");
     EXPECT_EQ(sample.Text(control("T"), 0), "$12.50");
-    EXPECT_TRUE(sample.AlignsRight(control("T")));
+    EXPECT_TRUE(sample.AlignsRight(control("T"), 0));
     EXPECT_TRUE(sample.Checked(control("P"), 0));
     EXPECT_FALSE(sample.Checked(control("P"), 1));
     EXPECT_EQ(sample.Text(control("E"), 1), "Sum: 3, page 1");
