@@ -70,6 +70,57 @@ std::string ObjectNameOf(const std::string& argument) {
     return text::Trim(text::ReplaceAll(argument, "\"", ""));
 }
 
+/// Apart at the commas that stand neither in a quoted text nor in brackets.
+std::vector<std::string> SplitArguments(const std::string& list) {
+    std::vector<std::string> arguments(1);
+    bool quoted = false;
+    int depth = 0;
+    for (const char sign : list) {
+        if (sign == '"')
+            quoted = !quoted;
+        else if (!quoted && (sign == '(' || sign == ')'))
+            depth += sign == '(' ? 1 : -1;
+        if (sign == ',' && !quoted && depth <= 0)
+            arguments.emplace_back();
+        else
+            arguments.back() += sign;
+    }
+    return arguments;
+}
+
+/// Arguments that tell the object, in the places that they have without their names: its type, if the
+/// action asks for one, stands in front.
+constexpr std::array<std::string_view, 9> kNamesOfName{"ObjectName", "FormName",      "ReportName",
+                                                       "QueryName",  "TableName",     "MacroName",
+                                                       "ViewName",   "ProcedureName", "DataAccessPageName"};
+
+std::size_t PlaceOf(const std::string& argumentName, bool typeInFront, std::size_t otherwise) {
+    if (text::EqualsIgnoringCase(argumentName, "ObjectType"))
+        return 0;
+    for (const std::string_view name : kNamesOfName)
+        if (text::EqualsIgnoringCase(argumentName, name))
+            return typeInFront ? 1 : 0;
+    return otherwise;
+}
+
+/// The first two arguments, which alone matter; absent ones are empty.
+std::array<std::string, 2> FirstArguments(const std::string& list, bool typeInFront) {
+    std::array<std::string, 2> first;
+    const std::vector<std::string> arguments = SplitArguments(list);
+    for (std::size_t i = 0; i < arguments.size(); ++i) {
+        std::string value = text::TrimWhitespace(arguments[i]);
+        std::size_t place = i;
+        const auto sign = value.find(":=");
+        if (sign != std::string::npos && value.find('"') > sign) {
+            place = PlaceOf(text::TrimWhitespace(value.substr(0, sign)), typeInFront, first.size());
+            value = text::TrimWhitespace(value.substr(sign + 2));
+        }
+        if (place < first.size())
+            first[place] = value;
+    }
+    return first;
+}
+
 } // namespace
 
 ResultCode CDoCmdParser::Parse(const std::string& vstrCodeLine) {
@@ -83,25 +134,27 @@ ResultCode CDoCmdParser::Parse(const std::string& vstrCodeLine) {
     if (actionName_.empty())
         return kUnknownLine;
 
-    std::vector<std::string> arguments;
-    if (blank != std::string::npos)
-        arguments = text::Split(text::TrimWhitespace(call.substr(blank)), ",");
-    arguments.resize(std::max<std::size_t>(arguments.size(), 2));
     objTypeName_.clear();
     objName_.clear();
     msgCode_.clear();
+    objNameIsQuoted_ = false;
 
     const Action* action = FindAction(actionName_);
     if (action == nullptr)
         return kUnknownLine;
     msgCode_ = action->msgCode;
-    if (action->from == ObjectFrom::FixedType) {
-        objTypeName_ = action->type;
-        objName_ = ObjectNameOf(arguments[0]);
-    } else if (action->from == ObjectFrom::Arguments) {
+    objTypeName_ = action->type;
+    if (action->from == ObjectFrom::Nothing)
+        return kSuccess;
+    const bool typeInFront = action->from == ObjectFrom::Arguments;
+    const std::string list =
+        blank == std::string::npos ? std::string() : text::TrimWhitespace(call.substr(blank));
+    const auto arguments = FirstArguments(list, typeInFront);
+    if (typeInFront)
         objTypeName_ = TypeNameOf(arguments[0]);
-        objName_ = ObjectNameOf(arguments[1]);
-    }
+    const std::string& name = arguments[typeInFront ? 1 : 0];
+    objNameIsQuoted_ = name.starts_with('"');
+    objName_ = ObjectNameOf(name);
     return kSuccess;
 }
 

@@ -6,7 +6,8 @@
 
 namespace tovimar {
 
-/// Reads one line of code that calls a command of the host, such as `DoCmd.OpenForm "Orders", acNormal`.
+/// Reads one line of code that calls a command of the host, such as `DoCmd.OpenForm "Orders", acNormal` or
+/// `DoCmd.Close ObjectName:="Orders", ObjectType:=acForm`.
 class CDoCmdParser {
 public:
     /// 0 for a line that it knows, 0x8003FE07 for any other.
@@ -17,6 +18,8 @@ public:
     const std::string& ObjTypeName() const { return objTypeName_; }
     std::string ObjTypeCode() const { return "ac" + objTypeName_; }
     const std::string& ObjName() const { return objName_; }
+    /// False for a name that the code computes or keeps in a variable.
+    bool ObjNameIsQuoted() const { return objNameIsQuoted_; }
     /// First part of the message code: "DoCmd.Open", "DoCmd.Close", "DoCmd.Save", "DoCmd.Run",
     /// "DoCmd.PrintOut".
     const std::string& MsgCode() const { return msgCode_; }
@@ -29,6 +32,7 @@ private:
     std::string actionName_;
     std::string objTypeName_;
     std::string objName_;
+    bool objNameIsQuoted_ = false;
     std::string msgCode_;
 };
 

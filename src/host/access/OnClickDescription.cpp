@@ -1,13 +1,17 @@
-// What the click of a command button does, told from the code behind it.
+// What the click of a command button does, told from the code or the macro behind it.
 #include "foundation/CXmlMessages.h"
 #include "foundation/ErrorTrap.h"
 #include "foundation/Session.h"
 #include "host/access/CDoCmdParser.h"
 #include "host/access/CN_IDEAccFormProcessor.h"
+#include "host/access/EmbeddedMacro.h"
+#include "host/access/EventCode.h"
 #include "host/access/LateBound.h"
+#include "host/access/NodeReference.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 
+#include <utility>
 #include <vector>
 
 namespace tovimar {
@@ -16,6 +20,7 @@ namespace {
 constexpr std::int32_t kCommandButton = 104;
 constexpr std::int32_t kProcedure = 0; ///< the code model's number for a Sub or Function
 constexpr std::string_view kOwnName = "Me.Name";
+constexpr const char* kRunMacro = "DoCmd.Run acMacro";
 
 /// Null for a form without a module.
 HostObject CodeModuleOf(const HostObject& app, const HostObject& form) {
@@ -52,55 +57,106 @@ std::string ProcedureLines(const HostObject& module, const std::string& procedur
     return late::Text(module, "Lines", {body, start + count - body});
 }
 
-/// Lines that go on with "_" joined, trimmed, without empty ones.
-std::vector<std::string> LogicalLines(const std::string& code) {
-    std::vector<std::string> lines;
-    std::string kept;
-    for (const std::string& piece : text::Split(code, "\n")) {
-        std::string line = text::TrimWhitespace(piece);
-        if (line.empty())
-            continue;
-        const bool goesOn = line.back() == '_';
-        if (goesOn)
-            line.pop_back();
-        kept += (kept.empty() ? "" : " ") + line;
-        if (goesOn)
-            continue;
-        lines.push_back(text::TrimWhitespace(kept));
-        kept.clear();
-    }
-    return lines;
+/// A macro of a group, "Daily.Print", is told in the topic of its group.
+std::string MacroReference(const std::string& name) {
+    const CHelpPrjTree* tree = Session::HelpProjectTree();
+    const auto point = name.find('.');
+    if (point == std::string::npos || tree == nullptr || !tree->GetNodeHtmlRef(name, "macro").empty())
+        return NodeReference(name, "macro");
+    return NodeReference(name.substr(0, point), "macro") + NameAsHtml(name.substr(point));
 }
 
 std::string ReferenceTo(const std::string& name, const std::string& typeName) {
-    const CHelpPrjTree* tree = Session::HelpProjectTree();
-    const std::string reference = tree == nullptr ? std::string() : tree->GetNodeHtmlRef(name, typeName);
-    return reference.empty() ? name : reference;
+    return text::EqualsIgnoringCase(typeName, "macro") ? MacroReference(name) : NodeReference(name, typeName);
 }
 
-std::string SentenceOf(const CDoCmdParser& call) {
-    const CXmlMessages& messages = *Session::Messages();
-    if (call.ObjTypeName().empty())
-        return messages.GetMessageWithParams(call.MsgCode(), {call.ObjName()});
-    const std::string code = call.MsgCode() + " " + call.ObjTypeCode();
-    if (text::EqualsIgnoringCase(call.ObjName(), kOwnName))
-        return messages.GetMessageWithParams(code + " " + std::string(kOwnName), {});
-    return messages.GetMessageWithParams(code, {ReferenceTo(call.ObjName(), call.ObjTypeName())});
-}
+/// Tells a procedure's commands one after the other.
+class CommandsTeller {
+public:
+    /// `module` may be null; its constants are asked for only when a command names one.
+    explicit CommandsTeller(HostObject module) : module_(std::move(module)) {}
 
-std::string DescriptionOfCode(const std::string& code) {
-    std::string description;
-    if (!text::ContainsIgnoringCase(code, "DoCmd."))
-        return description;
-    for (const std::string& line : LogicalLines(code)) {
+    void Tell(const std::string& statement) {
+        names_.Take(statement);
         CDoCmdParser call;
-        if (call.Parse(line) != kSuccess)
-            continue;
-        if (!description.empty())
-            description += "<BR>\r\n";
-        description += SentenceOf(call);
+        if (call.Parse(statement) != kSuccess)
+            return;
+        if (!text_.empty())
+            text_ += "<BR>\r\n";
+        text_ += SentenceOf(call);
     }
-    return description;
+    const std::string& Text() const { return text_; }
+
+private:
+    std::string SentenceOf(const CDoCmdParser& call) {
+        const CXmlMessages& messages = *Session::Messages();
+        if (call.ObjTypeName().empty())
+            return messages.GetMessageWithParams(call.MsgCode(), {NameAsHtml(call.ObjName())});
+        const std::string code = call.MsgCode() + " " + call.ObjTypeCode();
+        const std::string own = messages.GetMessage(code + " " + std::string(kOwnName));
+        // Without a name the object at hand is meant.
+        if (text::EqualsIgnoringCase(call.ObjName(), kOwnName) || (call.ObjName().empty() && !own.empty()))
+            return own;
+        return messages.GetMessageWithParams(code, {ReferenceTo(NameMeantBy(call), call.ObjTypeName())});
+    }
+
+    /// A variable or constant stands for the text that it was given.
+    std::string NameMeantBy(const CDoCmdParser& call) {
+        const std::string& name = call.ObjName();
+        if (call.ObjNameIsQuoted())
+            return name;
+        if (const std::string* text = names_.Find(name))
+            return *text;
+        const std::string* text = Constants().Find(name);
+        return text == nullptr ? name : *text;
+    }
+
+    const TextNames& Constants() {
+        if (HostObject module = std::exchange(module_, nullptr))
+            PassOver([&] {
+                const std::int32_t count = late::Integer(module, "CountOfLines");
+                for (const std::string& line : EventStatements(late::Text(module, "Lines", {1, count})))
+                    if (FindOutsideQuotes(line, "Const ") != std::string::npos)
+                        constants_.Take(line);
+            });
+        return constants_;
+    }
+
+    HostObject module_;
+    TextNames names_;     ///< of the procedure
+    TextNames constants_; ///< of the module
+    std::string text_;
+};
+
+std::string DescriptionOfCode(const HostObject& module, const std::string& code) {
+    if (!text::ContainsIgnoringCase(code, "DoCmd."))
+        return {};
+    CommandsTeller teller(module);
+    for (const std::string& statement : EventStatements(code))
+        teller.Tell(statement);
+    return teller.Text();
+}
+
+std::string DescriptionOfEmbeddedMacro(const HostObject& control) {
+    CommandsTeller teller(nullptr);
+    for (const std::string& command : CommandsOfEmbeddedMacro(late::TextOrEmpty(control, "OnClickEmMacro")))
+        teller.Tell(command);
+    return teller.Text();
+}
+
+std::string DescriptionOfEvent(const HostObject& app, const HostObject& form, const HostObject& control) {
+    const std::string event = text::Trim(late::Text(control, "onclick"));
+    if (event.empty())
+        return {};
+    // Such a macro needs no module.
+    if (text::EqualsIgnoringCase(event, "[Embedded Macro]"))
+        return DescriptionOfEmbeddedMacro(control);
+    const HostObject module = CodeModuleOf(app, form);
+    if (!module || event.front() == '=')
+        return {};
+    if (text::EqualsIgnoringCase(event, "[Event procedure]"))
+        return DescriptionOfCode(module, ProcedureLines(module, ProcedureName(control)));
+    return Session::Messages()->GetMessageWithParams(kRunMacro, {MacroReference(event)});
 }
 
 } // namespace
@@ -111,19 +167,8 @@ std::string CN_IDEAccFormProcessor::GetOnClickActionDescription(const HostObject
     std::string description;
     if (late::IntegerOrZero(rctl, "ControlType") != kCommandButton)
         return description;
-    Trapped("CN_IDEAccFormProcessor", "GetOnClickActionDescription", [&] {
-        const std::string event = text::Trim(late::Text(rctl, "onclick"));
-        if (event.empty())
-            return;
-        const HostObject module = CodeModuleOf(rapp, rfrm);
-        if (!module || event.front() == '=')
-            return;
-        if (text::EqualsIgnoringCase(event, "[Event procedure]"))
-            description = DescriptionOfCode(ProcedureLines(module, ProcedureName(rctl)));
-        else
-            description =
-                Session::Messages()->GetMessageWithParams("DoCmd.Run acMacro", {ReferenceTo(event, "macro")});
-    });
+    Trapped("CN_IDEAccFormProcessor", "GetOnClickActionDescription",
+            [&] { description = DescriptionOfEvent(rapp, rfrm, rctl); });
     return description;
 }
 
