@@ -92,6 +92,25 @@ TEST_F(TemplatesTest, PicturesOfAnotherScaleSayHowLargeTheyAreShown) {
     EXPECT_NE(std::string::npos, image("g").find("WIDTH=\"90\" HEIGHT=\"68\" ")) << "with the frame's title";
 }
 
+TEST_F(TemplatesTest, PagesNameEachPictureAndArea) {
+    auto form = Loaded(
+        "<Form Name='F' Text='Say \"Hi\" &amp;&amp; go' HasMap='True'><Controls>"
+        "<TextBox Name='txtBare' Location='1, 1'/>"
+        "<Frame Name='g' Text='A &lt;b&gt; \"c\"' PicFileName='g.jpg'><Controls><TextBox Name='x' Text='X'/>"
+        "</Controls></Frame></Controls></Form>");
+    form->SetPicFullPath(WriteFile("images\\F.jpg", "x"));
+    const std::string page = Built(*form, WriteFile("t.htm", "{{MAP}}{{IMAGE}}{{Controls}}wbh"));
+    for (const char* part :
+         {"<IMG SRC=\"images\\F.jpg\" BORDER=0 \r\nUSEMAP=\"#F\" ALT=\"Say &#34;Hi&#34; &#38; go\" />",
+          "USEMAP=\"#F_g\" ALT=\"A &#60;b&#62; &#34;c&#34;\" />",
+          "HREF=\"#F_txtBare\" FRAME=\"\" alt=\"txtBare\" />",
+          "HREF=\"#F_g\" FRAME=\"\" alt=\"A &lt;b> &quot;c&quot;\" />"})
+        EXPECT_NE(std::string::npos, page.find(part)) << part << page;
+    // The pieces on their own are what earlier versions wrote.
+    EXPECT_EQ(std::string::npos, templates.MainImage(*form, true, "").find("ALT"));
+    EXPECT_NE(std::string::npos, templates.ControlsMap(*form).find("#F_txtBare\" FRAME=\"\" alt=\"\" />"));
+}
+
 TEST_F(TemplatesTest, PicturesByPathAreRelativeToTheTopicWhereTheyLieBelowIt) {
     auto form = Orders();
     EXPECT_NE(std::string::npos, templates.MainImage(*form, false, "").find("SRC=\"images\\Orders.jpg\""));
