@@ -24,8 +24,9 @@ TEST_F(CommandsTest, WhatTheyShow) {
         const char* golden;
         std::vector<std::string> arguments;
     };
-    const std::array<Shown, 5> all{{{"help.txt", {"--help"}},
+    const std::array<Shown, 6> all{{{"help.txt", {"--help"}},
                                     {"help-generate.txt", {"generate", "--help"}},
+                                    {"help-screenshot.txt", {"screenshot", "--help"}},
                                     {"version.txt", {"--version"}},
                                     {"options.txt", {"options"}},
                                     {"list.txt", {"list", kSample}}}};

@@ -156,6 +156,17 @@ void HelpFolder::CheckPictures(const std::string& page, const std::vector<Tag>& 
             CheckArea(page, tag, sizeByMap[map]);
 }
 
+void HelpFolder::CheckNames(const std::string& page, const std::string& html, const std::vector<Tag>& tags) {
+    for (const Tag& tag : tags) {
+        if ((tag.name == "img" || tag.name == "area") && tag.Attribute("alt").empty())
+            faults_.push_back(page + ": no name for " + tag.Attribute("src") + tag.Attribute("href"));
+        if (tag.name == "html" && tag.Attribute("lang").empty())
+            faults_.push_back(page + ": no language");
+    }
+    if (html.find("<title></title>") != std::string::npos || html.find("{{") != std::string::npos)
+        faults_.push_back(page + ": not filled in");
+}
+
 std::vector<std::string> HelpFolder::Faults() {
     faults_.clear();
     for (const char* extension : {".hhc", ".hhk"})
@@ -164,7 +175,9 @@ std::vector<std::string> HelpFolder::Faults() {
                 if (tag.name == "param" && text::EqualsIgnoringCase(tag.Attribute("name"), "Local"))
                     CheckLink(list, tag.Attribute("value"));
     for (const std::string& page : FilesWith(".htm")) {
-        const auto tags = TagsOf(ReadWhole(folder_ / page));
+        const std::string html = ReadWhole(folder_ / page);
+        const auto tags = TagsOf(html);
+        CheckNames(page, html, tags);
         CheckPictures(page, tags);
         for (const Tag& tag : tags)
             CheckLink(page, tag.Attribute("href"));

@@ -24,8 +24,10 @@ class HelpFolder {
 public:
     explicit HelpFolder(std::filesystem::path folder) : folder_(std::move(folder)) {}
 
-    /// One line for each link of contents, index and topics that leads nowhere, each picture that is missing
-    /// and each area that isn't inside its picture. Topics that open in the frame page's stead count as it.
+    /// One line for each link of contents, index and topics that leads nowhere, each picture that is missing,
+    /// each area that isn't inside its picture, each page, picture and area that readers who don't see it
+    /// aren't told of, and each tag that nothing filled in. Topics that open in the frame page's stead count
+    /// as it.
     std::vector<std::string> Faults();
     /// Entries of the project's file list.
     std::vector<std::string> ListedFiles() const;
@@ -36,6 +38,7 @@ public:
 private:
     std::vector<std::string> FilesWith(const std::string& extension) const;
     void CheckLink(const std::string& from, const std::string& link);
+    void CheckNames(const std::string& page, const std::string& html, const std::vector<Tag>& tags);
     void CheckPictures(const std::string& page, const std::vector<Tag>& tags);
     void CheckArea(const std::string& page, const Tag& area, std::pair<int, int> size);
     const std::set<std::string>& AnchorsOf(const std::string& page);
