@@ -20,12 +20,12 @@ std::string Place(int left, int top, int width, int height) {
     return out.str();
 }
 
-/// A text box with its attached label, as the host nests them.
-std::string LabelledBox(int index) {
+/// A text or combo box with its attached label, as the host nests them.
+std::string LabelledBox(int index, const std::string& kind = "TextBox") {
     const int top = 120 + index / 2 * 420;
     const int left = index % 2 * 5400 + 120;
     const std::string number = std::to_string(index);
-    return "                Begin TextBox\r\n" + Place(left + 1800, top, 3000, 300) +
+    return "                Begin " + kind + "\r\n" + Place(left + 1800, top, 3000, 300) +
            "                    Name =\"txtField" + number +
            "\"\r\n                    ControlSource =\"Field" + number +
            "\"\r\n                    StatusBarText =\"What field " + number +
@@ -35,18 +35,45 @@ std::string LabelledBox(int index) {
            ":\"\r\n                        End\r\n                    End\r\n                End\r\n";
 }
 
-std::string Design(const std::string& kind, int number) {
+std::string Simple(const std::string& kind, int index, int left, int top, int width) {
+    const std::string number = std::to_string(index);
+    return "                Begin " + kind + "\r\n" + Place(left, top, width, 330) +
+           "                    Name =\"" + kind + number + "\"\r\n" +
+           (kind == "CommandButton" ? "                    Caption =\"Action &" + number + "\"\r\n" : "") +
+           "                    StatusBarText =\"What number " + number +
+           " does\"\r\n                End\r\n";
+}
+
+/// From the beginning of a form or report to where its detail section's controls go.
+std::string DesignStart(const std::string& kind, int number, int height) {
     const std::string name = std::to_string(number);
-    std::string text =
-        "Version =21\r\nVersionRequired =20\r\nBegin " + kind + "\r\n    Width =11000\r\n" +
-        "    RecordSource =\"tbl" + name + "\"\r\n    Caption =\"" + kind + " number " + name +
-        "\"\r\n    Begin\r\n        Begin Label\r\n            FontSize =9\r\n            FontName "
-        "=\"Calibri\"\r\n        End\r\n        Begin TextBox\r\n            FontSize =9\r\n       "
-        "     FontName =\"Calibri\"\r\n        End\r\n        Begin Section\r\n            Height "
-        "=5400\r\n            Name =\"Detail\"\r\n            Begin\r\n";
+    return "Version =21\r\nVersionRequired =20\r\nBegin " + kind + "\r\n    Width =11000\r\n" +
+           "    RecordSource =\"tbl" + name + "\"\r\n    Caption =\"" + kind + " number " + name +
+           "\"\r\n    Begin\r\n        Begin Label\r\n            FontSize =9\r\n            FontName "
+           "=\"Calibri\"\r\n        End\r\n        Begin TextBox\r\n            FontSize =9\r\n       "
+           "     FontName =\"Calibri\"\r\n        End\r\n        Begin Section\r\n            Height =" +
+           std::to_string(height) + "\r\n            Name =\"Detail\"\r\n            Begin\r\n";
+}
+
+constexpr const char* kDesignEnd = "            End\r\n        End\r\n    End\r\nEnd\r\n";
+
+std::string Design(const std::string& kind, int number) {
+    std::string text = DesignStart(kind, number, 5400);
     for (int i = 0; i < 24; ++i)
         text += LabelledBox(i);
-    return text + "            End\r\n        End\r\n    End\r\nEnd\r\n";
+    return text + kDesignEnd;
+}
+
+std::string LargeForm(int number) {
+    constexpr int kBoxes = 45;
+    std::string text = DesignStart("Form", number, 11000);
+    for (int i = 0; i < kBoxes; ++i)
+        text += LabelledBox(i, i % 15 == 14 ? "ComboBox" : "TextBox");
+    for (int i = 0; i < 4; ++i)
+        text += Simple("CheckBox", i, 5520 + i * 1200, 9360, 300);
+    for (int i = 0; i < 6; ++i)
+        text += Simple("CommandButton", i, 120 + i * 1750, 10080, 1500);
+    return text + kDesignEnd;
 }
 
 } // namespace
@@ -73,6 +100,11 @@ void WriteSyntheticApplication(const std::filesystem::path& folder, int objects)
             Write(folder / "forms" / ("frm" + name + ".form"), Design("Form", i));
         }
     }
+}
+
+void WriteLargeForms(const std::filesystem::path& folder, int forms) {
+    for (int i = 0; i < forms; ++i)
+        Write(folder / "forms" / ("frm" + std::to_string(i) + ".form"), LargeForm(i));
 }
 
 } // namespace tovimar::bench
