@@ -1,10 +1,15 @@
 #include "foundation/Session.h"
+#include "generation/CTovimarParameters.h"
 #include "host/FakeAccess.h"
 #include "host/access/CN_IDEAccContext.h"
+#include "host/access/CN_IDEAccFormProcessor.h"
 #include "host/server/CXmlCommand.h"
+#include "platform/windowing/WindowSystem.h"
 #include "support/FakeEnvironment.h"
 
 #include <gtest/gtest.h>
+
+#include <algorithm>
 
 namespace tovimar {
 namespace {
@@ -114,6 +119,150 @@ TEST_F(ContextTest, RelationsList) {
     EXPECT_EQ(access.calls, std::vector<std::string>{"RunCommand 133"});
 }
 
+/// A window that is all black.
+class BlankWindow : public platform::Window {
+public:
+    platform::Bitmap Paint(double) override { return platform::BlackBitmap(20, 10); }
+};
+
+TEST_F(ContextTest, PictureOfTheRelations) {
+    access.lists["Relations"]->items = {MakeFake("Relation")};
+    access.lists["Relations"]->items[0]->With("Table", "A").With("ForeignTable", "B").With("Attributes", 0);
+    access.lists["Relations"]->items[0]->With("Fields", HostObject(MakeList()));
+    const std::string list = "<H2>A -> B (1:N, )</H2>";
+    const auto answering = [this](std::function<void()> open) {
+        std::dynamic_pointer_cast<test::FakeObject>(access.app->Get("DoCmd").AsObject())
+            ->On("RunCommand", [open = std::move(open)](const auto&) {
+                open();
+                return Value();
+            });
+        boxes->shown.clear();
+        return Ask("ScreenshotDatamodelWindow");
+    };
+    EXPECT_EQ(answering([] { throw RaisedError(2046, "not now", "DoCmd"); }), list);
+    ASSERT_EQ(boxes->shown.size(), 1U);
+    EXPECT_EQ(boxes->shown[0].text, "The command or action 'Relationships' isn't available now (Err# 2046).");
+    EXPECT_EQ(Session::Run().runErrorCount, 0);
+    EXPECT_EQ(answering([] { throw RaisedError(2501, "cancelled", "DoCmd"); }), list);
+    EXPECT_EQ(Session::Run().runErrorCount, 1);
+
+    // The window is found below the host's, and goes even when its picture can't be written.
+    CTovimarParameters parameters;
+    Session::SetParameters(&parameters);
+    auto& windows = *environment->windows;
+    const std::int32_t main = windows.Open(std::make_unique<BlankWindow>());
+    access.app->With("hWndAccessApp", main);
+    EXPECT_EQ(answering([&] {
+                  auto window = std::make_unique<BlankWindow>();
+                  window->className = "OSysRel";
+                  window->parent = main;
+                  window->rectangle = {0, 0, 20, 10};
+                  windows.Open(std::move(window));
+              }),
+              list);
+    EXPECT_EQ(windows.FirstChild(main), 0);
+    Session::SetParameters(nullptr);
+}
+
+TEST_F(ContextTest, SmallCommands) {
+    int events = 0;
+    environment->doEvents = [&events] { ++events; };
+    for (const char* command : {"Doevents", "HideIDEWindows", "ResetIDEWindows", "ParseSourceProject"})
+        EXPECT_EQ(Ask(command), "(none)") << command;
+    EXPECT_EQ(events, 1);
+    for (const char* command : {"CurrentSourceProjectIsNewUnsaved", "CurrentSourceProjectCodeIsDisabled"})
+        EXPECT_EQ(Ask(command), "False") << command;
+    EXPECT_EQ(Ask("IDEDisplayModelIsMDI"), "True");
+    EXPECT_EQ(Ask("SetUseProjectGroupAsSourceFlag", {{"UseProjectGroupAsSourceFlag", true}}), "(none)");
+    EXPECT_EQ(Ask("SetCurrentSourceProject", {{"ProjectName", "Orders"}}), "(none)");
+
+    EXPECT_EQ(Ask("UnhideDbWindow"), "(none)");
+    EXPECT_TRUE(access.calls.empty());
+    access.app->With("Version", "9.0");
+    Run("UnhideDbWindow");
+    EXPECT_EQ(access.calls, std::vector<std::string>{"SelectObject 0  True"});
+
+    EXPECT_EQ(Ask("ActiveObjectName"), "");
+    const Fake screen = MakeFake("Screen");
+    screen->With("ActiveReport", HostObject(MakeFake("Report_R", "R")));
+    access.app->With("Screen", HostObject(screen))
+        .With("CurrentObjectName", "T")
+        .With("CurrentObjectType", 0);
+    EXPECT_EQ(Ask("ActiveObjectName"), "R");
+    screen->With("ActiveForm", HostObject(MakeFake("Form_F", "F")));
+    EXPECT_EQ(Ask("ActiveObjectName") + Ask("CurrentObjectName") + Ask("CurrentObjectType"), "FT0");
+
+    std::string saved;
+    access.saveAsText = [&saved](const std::string& name, const std::string& path) { saved = name + path; };
+    EXPECT_EQ(Ask("SaveAsText", {{"ObjType", 2}, {"ObjName", "F"}, {"FullPath", "C:\\f.txt"}}), "(none)");
+    EXPECT_EQ(saved, "FC:\\f.txt");
+    EXPECT_EQ(Session::Run().runErrorCount, 0);
+}
+
+TEST_F(ContextTest, DescriptionsOnAServer) {
+    access.project->With("ProjectType", 1);
+    const Fake connected = MakeFake("Connection");
+    connected->With("ConnectionString", "Provider=X");
+    access.project->With("Connection", HostObject(connected));
+    std::vector<std::string> asked;
+    const auto rows = [](std::vector<std::pair<std::string, std::string>> pairs) {
+        const Fake set = MakeFake("Recordset");
+        const auto at = std::make_shared<std::size_t>(0);
+        set->On("EOF", [=](const auto&) { return Value(*at >= pairs.size()); });
+        set->On("MoveNext", [=](const auto&) {
+            ++*at;
+            return Value();
+        });
+        set->On("Fields", [=](const auto& a) {
+            const Fake field = MakeFake("Field");
+            const auto& [name, value] = pairs.at(*at);
+            field->With("Value", a.at(0).AsString() == "name" ? name : value);
+            return Value(HostObject(field));
+        });
+        return set;
+    };
+    access.app->On("CreateObject", [&](const auto& kind) {
+        const Fake object = MakeFake(kind.at(0).AsString());
+        for (const char* member : {"Open", "Close"})
+            object->On(member, [&asked, member](const auto& a) {
+                asked.push_back(a.empty() ? member : std::string(member) + " " + a[0].AsString());
+                return Value();
+            });
+        object->On("Execute", [&](const auto& a) {
+            asked.push_back(a.at(0).AsString());
+            return Value(HostObject(rows({{"Caption", "no"}, {"ms_description", "All orders"}})));
+        });
+        const Fake table = MakeFake("Table", "O'Neil");
+        table->With("Columns", HostObject(MakeList({MakeFake("Column", "ID"), MakeFake("Column", "City")})));
+        object->With("Tables", HostObject(MakeList({table})));
+        return Value(HostObject(object));
+    });
+    EXPECT_EQ(Ask("GetComponentDescription", {{"CompName", "O'Neil"}}), "All orders");
+    EXPECT_EQ(asked, (std::vector<std::string>{
+                         "Open Provider=X",
+                         "SELECT * FROM ::fn_listextendedproperty (null, 'user', 'dbo', 'table', 'O''Neil', "
+                         "default, default)",
+                         "Close"}));
+    EXPECT_EQ(Ask("GetQueryDescription", {{"CompName", "Q"}}), "");
+    EXPECT_EQ(Ask("GetMacroDescription", {{"CompName", "M"}}), "");
+
+    asked.clear();
+    CN_IDEAccFormProcessor processor;
+    processor.SetIdeAppInstance(access.app);
+    const CControlsCollection fields = processor.FieldsCollectionGet("O'Neil", "Table");
+    ASSERT_EQ(fields.Count(), 2);
+    EXPECT_EQ(processor.PropertyValue(fields.Items().At(2), "Name"), Value("City"));
+    EXPECT_EQ(processor.PropertyValue(fields.Items().At(2), "TabIndex"), Value(1));
+    EXPECT_EQ(processor.PropertyValue(fields.Items().At(2), "Description"), Value("All orders"));
+    EXPECT_EQ(std::count(asked.begin(), asked.end(),
+                         "SELECT * FROM ::fn_listextendedproperty (null, 'user', 'dbo', 'table', 'O''Neil', "
+                         "'column', 'City')"),
+              1);
+    EXPECT_EQ(std::count(asked.begin(), asked.end(), "Close"), 3) << "no connection stays open";
+    EXPECT_EQ(processor.FieldsCollectionGet("Q", "Query").Count(), 0);
+    EXPECT_EQ(Session::Run().runErrorCount, 0);
+}
+
 TEST_F(ContextTest, MeterAndPointer) {
     Run("ProgressMeterUpdate", {{"CurrentValue", 1}});
     Run("ProgressMeterInit", {{"Message", "Forms"}, {"MaxVal", 9}});
@@ -142,6 +291,7 @@ TEST_F(ContextTest, ObjectsOpenCloseAndTakeTheirHelp) {
               "77");
     Run("SetComponentHelpContextId", {{"ObjType", 2}, {"ObjName", "Orders"}, {"HelpContextId", 120}});
     EXPECT_EQ(form->Get("HelpContextId"), Value(120));
+    EXPECT_EQ(form->Get("HelpFile"), Value(".chm")) << "the project has no name";
     Run("CloseComponent", {{"ObjType", 2}, {"ObjName", "Orders"}, {"SaveComponentFlag", true}});
     Run("CloseComponent", {{"ObjType", 2}, {"ObjName", "Orders"}, {"SaveComponentFlag", true}});
     EXPECT_EQ(access.calls, (std::vector<std::string>{"OpenForm Orders 1", "Close 2 Orders 1"}));
@@ -181,6 +331,24 @@ TEST_F(ContextTest, ControlByItsPath) {
     EXPECT_EQ(activate(), "True");
     EXPECT_EQ(tab->Get("Value"), Value(0));
     EXPECT_EQ(focus.size(), 6U);
+
+    // In design view every page can be shown, and the host is told to draw it.
+    form->With("currentview", 0);
+    access.calls.clear();
+    EXPECT_EQ(activate(), "True");
+    EXPECT_EQ(tab->Get("Value"), Value(2));
+    EXPECT_EQ(access.calls, std::vector<std::string>{"RunCommand 40"});
+    const auto path = [this](const char* controls, bool runtime) {
+        return Ask("ActivateControl", {{"ControlFullPath", std::string("Form.Orders.") + controls},
+                                       {"RuntimeFlag", runtime},
+                                       {"SetFocusFlag", true}});
+    };
+    focus.clear();
+    EXPECT_EQ(path("Frame.sub", true), "True");
+    EXPECT_EQ(path("Subform.sub.TextBox.txt", false), "True");
+    EXPECT_TRUE(focus.empty()) << "a frame takes no focus, and a design none at all";
+    EXPECT_EQ(path("TextBox.gone", true), "False");
+    EXPECT_EQ(Session::Run().runErrorCount, 1);
 }
 
 TEST_F(ContextTest, FailuresStayInside) {

@@ -1,4 +1,7 @@
+#include "foundation/CXmlMessages.h"
 #include "foundation/Session.h"
+#include "host/access/CN_IDEAccFormProcessor.h"
+#include "host/access/LateBound.h"
 #include "host/contract/IHelpPrjSourceProject.h"
 #include "host/contract/ObjectTypes.h"
 #include "host/server/CTovimarClient.h"
@@ -6,6 +9,7 @@
 #include "host/server/CTovimarServerAgent.h"
 #include "host/server/CXmlCommand.h"
 #include "host/sources/CHelpPrjSourceItem.h"
+#include "platform/Environment.h"
 #include "platform/access/AccessApplication.h"
 #include "platform/xml/XmlDocument.h"
 #include "support/FakeEnvironment.h"
@@ -13,6 +17,7 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <tuple>
 
 namespace tovimar {
 namespace {
@@ -51,6 +56,43 @@ TEST_P(CorpusTest, EveryObjectIsDescribed) {
     EXPECT_FALSE(project->Forms().Empty());
     for (const auto& box : boxes->shown)
         ADD_FAILURE() << box.text;
+}
+
+/// The sample that the program comes with: its buttons say what they do.
+class SampleButtonsTest : public test::EnvironmentTest {};
+
+TEST_F(SampleButtonsTest, SayWhatTheyDo) {
+    CXmlMessages messages;
+    messages.Load(
+        environment->files->FromNative(SourceFolder() + "install/Templates/Localized/EN/Messages.xml"));
+    Session::SetMessages(&messages);
+    CTovimarClient client;
+    const HostObject app = platform::access::OpenAccessApplication(SourceFolder() + "samples/orchard");
+    ASSERT_EQ(client.Connect(app), kSuccess);
+    const std::tuple<const char*, const char*, const char*> buttons[] = {
+        {"Main Menu", "cmdOrders", "Opens the form Orders."},
+        {"Main Menu", "cmdPriceList", "Opens the report Price List."},
+        {"Main Menu", "cmdMorning", "Runs the macro Morning Routine."},
+        {"Main Menu", "cmdClose", "Closes this form."},
+        {"Customers", "cmdNewOrder", "Opens the form Orders."},
+        {"Product Details", "cmdReorder", "Opens the query Products to Reorder."},
+        {"Product Details", "cmdClose", "Closes this window."},
+        {"Search", "cmdShow",
+         "Opens the form Customers.<BR>\r\nOpens the form Orders.<BR>\r\nOpens the form Product Details."},
+    };
+    CN_IDEAccFormProcessor processor;
+    processor.SetIdeAppInstance(app);
+    for (const auto& [formName, name, sentence] : buttons) {
+        const HostObject entry =
+            late::Object(late::Object(app, "CurrentProject"), "AllForms", {Value(formName)});
+        const HostObject form = processor.FindActualFormOfComponent(entry);
+        const HostObject button = late::Object(form, "Controls", {Value(name)});
+        EXPECT_EQ(processor.GetOnClickActionDescription(app, form, button), sentence)
+            << formName << "." << name;
+        processor.ActualFormClose(entry, form);
+    }
+    client.Disconnect();
+    Session::SetMessages(nullptr);
 }
 
 INSTANTIATE_TEST_SUITE_P(Applications, CorpusTest, ::testing::Values("vcs-testing", "sports-admin"));

@@ -3,6 +3,7 @@
 #include "generation/CTovimarParameters.h"
 #include "host/FakeAccess.h"
 #include "host/access/CN_IDEAccFormProcessor.h"
+#include "host/access/clsAccCmdBarControls.h"
 #include "platform/MessageBoxAnswers.h"
 #include "support/FakeEnvironment.h"
 
@@ -178,6 +179,14 @@ TEST_F(FormProcessorTest, TabPages) {
     tab->With("TabFixedWidth", 1500).With("TabFixedHeight", 0).With("FontSize", 8).With("FontWeight", 400);
     EXPECT_EQ(tabRectangle(0), (Strings{"20", "100", "19"}));
     EXPECT_EQ(tabRectangle(1), (Strings{"120", "100", "19"}));
+    // Without a fixed width a tab is as wide as its caption needs: 167 twips for a letter of 8 points.
+    tab->With("TabFixedWidth", 0).With("TabFixedHeight", 300);
+    processor.ActualFormClose(nullptr, form);
+    EXPECT_EQ(tabRectangle(0), (Strings{"20", "50", "20"})) << "&First";
+    EXPECT_EQ(tabRectangle(1), (Strings{"70", "42", "20"})) << "pgTwo";
+    tab->With("FontSize", 10).With("FontWeight", 700);
+    processor.ActualFormClose(nullptr, form);
+    EXPECT_EQ(tabRectangle(1), (Strings{"93", "61", "20"}));
 }
 
 TEST_F(FormProcessorTest, Rectangles) {
@@ -261,6 +270,14 @@ TEST_F(FormProcessorTest, ReportWithoutPreview) {
     access.openFailures = {2501};
     EXPECT_EQ(processor.FindActualReportOfComponent(entry, /*vfHidden=*/true), nullptr);
     EXPECT_EQ(boxes->shown.size(), 1U) << "hidden reports ask nothing";
+    access.openFailures = {2501, 3071};
+    boxes->answers = {platform::kAnswerRetry, platform::kAnswerCancel};
+    EXPECT_EQ(processor.FindActualReportOfComponent(entry), nullptr);
+    ASSERT_EQ(boxes->shown.size(), 3U);
+    EXPECT_EQ(boxes->shown[2].text,
+              "OpenReport action was cancelled for [Sales] report, would you like to retry?");
+    EXPECT_EQ(boxes->shown[2].title, "Tovimar Add-In");
+    EXPECT_EQ(access.calls.back(), "Close 3 Sales 2");
 }
 
 TEST_F(FormProcessorTest, WindowIsEnlargedForThePicture) {
@@ -305,6 +322,20 @@ TEST_F(FormProcessorTest, ViewTogglesAreBroughtUpAndPutBack) {
     processor.CorrectInsideWidthAndHeight(3, form, false);
     EXPECT_EQ(states(), (Strings{"0", "-1", "-1"}));
     processor.ResetInsideWidthAndHeight(3, form, false);
+    EXPECT_EQ(states(), (Strings{"-1", "-1", "-1"}));
+
+    clsAccCmdBarControls bars;
+    bars.Init(access.app);
+    EXPECT_TRUE(bars.ControlDefined(556));
+    EXPECT_FALSE(bars.ControlDefined(1));
+    toggles[0]->With("State", 0);
+    bars.Down();
+    EXPECT_EQ(states(), (Strings{"-1", "-1", "-1"}));
+    access.app->values.erase("commandbars");
+    bars.Init(access.app);
+    bars.Up();
+    bars.RestoreState();
+    EXPECT_FALSE(bars.ControlDefined(966));
     EXPECT_EQ(states(), (Strings{"-1", "-1", "-1"}));
 }
 

@@ -1,5 +1,6 @@
 // The commands that make pictures and pages of their own.
 #include "foundation/ErrorTrap.h"
+#include "foundation/Product.h"
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimarParameters.h"
@@ -15,6 +16,8 @@
 #include "screenshots/Screenshot.h"
 #include "uimodel/CXmlForm.h"
 
+#include <functional>
+
 namespace tovimar {
 namespace {
 
@@ -23,12 +26,24 @@ constexpr ResultCode kNotAvailableNow = 2046;
 constexpr std::int32_t kOpenRelationships = 133;
 constexpr const char* kRelationshipsClass = "OSysRel";
 
-void ReportDatamodelFailure(const RaisedError& failure) {
-    if (failure.Number() == kNotAvailableNow)
-        ShowMessage("The command or action 'Relationships' isn't available now (Err# 2046).", kMsgExclamation,
-                    "Tovimar Add-In");
-    else
-        ReportError(failure, kClass, "ScreenshotDatamodelWindow");
+/// A step that fails is told, and the ones behind it are done all the same.
+void DatamodelStep(const std::function<void()>& step) {
+    try {
+        step();
+    } catch (const RaisedError& failure) {
+        if (failure.Number() == kNotAvailableNow)
+            ShowMessage("The command or action 'Relationships' isn't available now (Err# 2046).",
+                        kMsgExclamation, kApplicationTitle);
+        else
+            ReportError(failure, kClass, "ScreenshotDatamodelWindow");
+    }
+}
+
+void CaptureDatamodel(CFormBitmapCapture& capture, std::int32_t window) {
+    if (const CTovimarParameters* parameters = Session::Parameters())
+        capture.CaptureWindowScreenshot(window, parameters->ImagesType(),
+                                        parameters->FolderForGeneratedImages() + "Datamodel" +
+                                            parameters->ImagesFileExt());
 }
 
 } // namespace
@@ -48,22 +63,17 @@ std::string CN_IDEAccContext::ScreenshotDatamodelWindow() {
     const auto find = [&] {
         return capture.GetIDEChildWindowHwndByWinClassName(mainWindow, kRelationshipsClass);
     };
-    try {
-        std::int32_t window = find();
-        if (window == 0) {
-            late::Call(late::Object(application_, "DoCmd"), "RunCommand", {kOpenRelationships});
-            myDoevents();
-            window = find();
-        }
-        const CTovimarParameters* parameters = Session::Parameters();
-        if (window != 0 && parameters != nullptr) {
-            capture.CaptureWindowScreenshot(window, parameters->ImagesType(),
-                                            parameters->FolderForGeneratedImages() + "Datamodel" +
-                                                parameters->ImagesFileExt());
-            platform::Env().windows->Close(window);
-        }
-    } catch (const RaisedError& failure) {
-        ReportDatamodelFailure(failure);
+    std::int32_t window = find();
+    if (window == 0) {
+        DatamodelStep(
+            [this] { late::Call(late::Object(application_, "DoCmd"), "RunCommand", {kOpenRelationships}); });
+        myDoevents();
+        window = find();
+    }
+    if (window != 0) {
+        myDoevents();
+        DatamodelStep([&] { CaptureDatamodel(capture, window); });
+        DatamodelStep([&] { platform::Env().windows->Close(window); });
     }
     return access_catalogue::RelationsHtml(application_);
 }

@@ -4,6 +4,7 @@
 #include "host/access/CN_IDEAccFormProcessor.h"
 #include "host/access/LateBound.h"
 #include "host/contract/ObjectTypes.h"
+#include "platform/Environment.h"
 #include "platform/text/Text.h"
 
 #include <charconv>
@@ -65,6 +66,7 @@ private:
             late::Set(tab, "Value", index);
         if (designView)
             late::Call(late::Object(app_, "DoCmd"), "RunCommand", {kRefreshAfterPageChange});
+        platform::Env().doEvents();
     }
 
     void FocusControl(const std::string& type, const std::string& name) {
