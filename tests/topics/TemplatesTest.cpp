@@ -5,6 +5,10 @@
 #include "support/Golden.h"
 #include "topics/TopicTest.h"
 
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+
 namespace tovimar {
 namespace {
 
@@ -179,6 +183,36 @@ TEST_F(TemplatesTest, FieldsOfAQueryLinkToTheirTables) {
     EXPECT_EQ("", templates.GenerateQueryFieldsHTML("qry", "<Query><InheritedFields Title='x'/></Query>"));
     EXPECT_EQ("", templates.GenerateQueryFieldsHTML("qry", "<Query"));
     EXPECT_EQ(1U, boxes->shown.size());
+}
+
+/// As the database stores names.
+std::string Wide(const std::string& ascii) {
+    std::string wide;
+    for (const char c : ascii)
+        wide.append({c, '\0'});
+    return wide;
+}
+
+/// A name in a table's definition, its length in front.
+std::string ColumnName(const std::string& name) {
+    return std::string{static_cast<char>(name.size() * 2), '\0'} + Wide(name);
+}
+
+TEST_F(TemplatesTest, DescriptionsComeFromADatabaseByTheirKey) {
+    const std::filesystem::path source(TOVIMAR_SOURCE_DIR "/../shared/corpus/access-forms/Reports.accdb");
+    if (!std::filesystem::exists(source))
+        GTEST_SKIP() << "the corpus is absent: " << source;
+    std::ostringstream read;
+    read << std::ifstream(source, std::ios::binary).rdbuf();
+    // A real database whose table and columns get names of the same lengths.
+    std::string bytes = text::ReplaceAll(read.str(), Wide("CustomerLabels"), Wide("tblDescription"));
+    bytes = text::ReplaceAll(bytes, ColumnName("City") + ColumnName("State"),
+                             ColumnName("Key") + ColumnName("States"));
+    bytes = text::ReplaceAll(bytes, ColumnName("AddressType"), ColumnName("Description"));
+    WriteFile("real\\Descriptions.mdb", bytes);
+    for (const auto& [key, description] : std::vector<std::pair<std::string, std::string>>{
+             {"East City", "HO"}, {"east CITY", "HO"}, {"West City", "HQ"}, {"East City ", ""}, {"it's", ""}})
+        EXPECT_EQ(description, templates.GetDescription(key, Path("real"))) << key;
 }
 
 TEST_F(TemplatesTest, DescriptionsComeFromTheControlWhereTheFileHasNone) {
