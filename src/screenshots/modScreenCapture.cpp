@@ -51,6 +51,13 @@ void WriteJpeg(const platform::Bitmap& picture, const std::string& path) {
     platform::Env().files->WriteFile(path, bytes);
 }
 
+void WritePicture(const platform::Bitmap& picture, const std::string& type, const std::string& path) {
+    if (text::EqualsIgnoringCase(type, kBmp))
+        platform::Env().files->WriteFile(path, platform::EncodeBmp(picture));
+    else if (text::EqualsIgnoringCase(type, kJpg))
+        WriteJpeg(picture, path);
+}
+
 void TraceFile(const std::string& path) {
     Line([&] {
         return "WritePictureToFile(1): Pic = " + path +
@@ -110,19 +117,22 @@ void WritePictureToFile(const Picture& Pic, const std::string& PicType, const st
     if (FileFullPath.empty() || Pic == nullptr)
         return;
     TraceFile(FileFullPath);
+    std::string description;
     const auto failed = Trapped(
         kModule, "WritePictureToFile",
         [&] {
-            if (text::EqualsIgnoringCase(PicType, kBmp))
-                platform::Env().files->WriteFile(FileFullPath, platform::EncodeBmp(*Pic));
-            else if (text::EqualsIgnoringCase(PicType, kJpg))
-                WriteJpeg(*Pic, FileFullPath);
+            try {
+                WritePicture(*Pic, PicType, FileFullPath);
+            } catch (const std::exception& failure) {
+                description = failure.what();
+                throw;
+            }
         },
         [&] { return FileFullPath; });
     Line([&] {
         return "WritePictureToFile(2): Pic = " + FileFullPath +
                ", FileExists = " + Yes(platform::Env().files->FileExists(FileFullPath)) +
-               ", ErrNum = " + std::to_string(failed) + ", Errdesc = ";
+               ", ErrNum = " + std::to_string(failed) + ", Errdesc = " + description;
     });
 }
 

@@ -63,6 +63,14 @@ TEST_F(CommandTest, HostileTextsEnd) {
         CXmlCommand().Deserialize(text).Serialize();
 }
 
+TEST_F(CommandTest, WhatNoNameHoldsEndsTheParameters) {
+    const CXmlCommand read = CXmlCommand().Deserialize(
+        "<cmd name=\"a\"><params P=\"&#60;\" torn Q=\"1<2\" ./><text><F Name=\"x\"/></text></cmd>");
+    EXPECT_EQ(read.ParamCount(), 2U);
+    EXPECT_EQ(read.GetParamValue("P") + read.GetParamValue("Q"), "<1<2");
+    EXPECT_EQ(CXmlCommand().Deserialize(read.Serialize()).ParamCount(), 2U);
+}
+
 TEST_F(CommandTest, ParametersKeepTheirOrder) {
     CXmlCommand command;
     command.Build("c", {{"A", 1}, {"B", 2}, {"C", 3}});

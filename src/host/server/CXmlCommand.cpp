@@ -54,6 +54,13 @@ char32_t CodePointOfReference(std::string_view name) {
     return whole && character ? static_cast<char32_t>(number) : 0;
 }
 
+/// The word in front of an "="; empty where something stands there that no name holds.
+std::string NameIn(std::string_view pairStart) {
+    const std::string start = text::Trim(pairStart);
+    const bool plain = text::IsValidUtf8(start) && start.find_first_of("<>&\"'/\t\r\n") == std::string::npos;
+    return plain ? start.substr(start.rfind(' ') + 1) : std::string();
+}
+
 } // namespace
 
 CXmlCommand& CXmlCommand::Build(const std::string& vstrName, CommandParameters pairs) {
@@ -154,10 +161,10 @@ void CXmlCommand::ScanParameters(std::string_view commandText, std::size_t from)
         if (equals == std::string_view::npos || open == std::string_view::npos)
             return;
         const auto close = commandText.find('"', open + 1);
-        if (close == std::string_view::npos)
+        const std::string name = NameIn(commandText.substr(nameStart, equals - nameStart));
+        if (close == std::string_view::npos || name.empty())
             return;
-        AddParamValue(text::Trim(commandText.substr(nameStart, equals - nameStart)),
-                      ReplaceSpecialCharsRev(commandText.substr(open + 1, close - open - 1)));
+        AddParamValue(name, ReplaceSpecialCharsRev(commandText.substr(open + 1, close - open - 1)));
         from = close + 1;
     }
 }
