@@ -221,7 +221,7 @@ TEST_F(OnClickTest, NamesOfObjects) {
         "If Me.Dirty Then DoCmd.OpenForm stDocName, , , \"a, b\" Else DoCmd.OpenReport PriceList\r\n"
         "' DoCmd.OpenForm \"Comment\"\r\nRem DoCmd.OpenForm \"Comment\"\r\n"
         "DoCmd.OpenForm \"PriceList\" ' a comment\r\nDoCmd.OpenForm other\r\nDoCmd.Close acForm\r\nEnd Sub";
-    EXPECT_EQ(Description(), "Opens R&amp;D &lt;1>.<BR>\r\nPrints Price List.<BR>\r\nOpens PriceList.<BR>\r\n"
+    EXPECT_EQ(Description(), "Opens R&D <1>.<BR>\r\nPrints Price List.<BR>\r\nOpens PriceList.<BR>\r\n"
                              "Opens other.<BR>\r\nCloses this form.");
 }
 
@@ -248,7 +248,7 @@ TEST_F(OnClickTest, LinksToTopics) {
     code = "DoCmd.OpenForm \"customers\"\r\nDoCmd.OpenReport \"Customers\"\r\n"
            "DoCmd.RunMacro \"Daily.Print <all>\"\r\nDoCmd.RunMacro \"Other.Print\"";
     EXPECT_EQ(Description(), "Opens <a href=\"c.htm\">Our customers</a>.<BR>\r\nPrints Customers.<BR>\r\n"
-                             "Runs <a href=\"d.htm\">Daily</a>.Print &lt;all>.<BR>\r\nRuns Other.Print.");
+                             "Runs <a href=\"d.htm\">Daily</a>.Print <all>.<BR>\r\nRuns Other.Print.");
     button->With("onclick", "Daily");
     EXPECT_EQ(Description(), "Runs <a href=\"d.htm\">Daily</a>.");
     Session::SetHelpProjectTree(nullptr);

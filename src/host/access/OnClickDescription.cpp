@@ -7,7 +7,6 @@
 #include "host/access/EmbeddedMacro.h"
 #include "host/access/EventCode.h"
 #include "host/access/LateBound.h"
-#include "host/access/NodeReference.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 
@@ -20,6 +19,7 @@ namespace {
 constexpr std::int32_t kCommandButton = 104;
 constexpr std::int32_t kProcedure = 0; ///< the code model's number for a Sub or Function
 constexpr std::string_view kOwnName = "Me.Name";
+constexpr const char* kMacro = "macro";
 constexpr const char* kRunMacro = "DoCmd.Run acMacro";
 
 /// Null for a form without a module.
@@ -57,17 +57,21 @@ std::string ProcedureLines(const HostObject& module, const std::string& procedur
     return late::Text(module, "Lines", {body, start + count - body});
 }
 
-/// A macro of a group, "Daily.Print", is told in the topic of its group.
-std::string MacroReference(const std::string& name) {
+/// HTML that links to an object's topic; empty for one without a topic.
+std::string TopicLink(const std::string& name, const std::string& typeName) {
     const CHelpPrjTree* tree = Session::HelpProjectTree();
-    const auto point = name.find('.');
-    if (point == std::string::npos || tree == nullptr || !tree->GetNodeHtmlRef(name, "macro").empty())
-        return NodeReference(name, "macro");
-    return NodeReference(name.substr(0, point), "macro") + NameAsHtml(name.substr(point));
+    return tree == nullptr ? std::string() : tree->GetNodeHtmlRef(name, typeName);
 }
 
+/// A macro of a group, "Daily.Print", is told in the topic of its group.
 std::string ReferenceTo(const std::string& name, const std::string& typeName) {
-    return text::EqualsIgnoringCase(typeName, "macro") ? MacroReference(name) : NodeReference(name, typeName);
+    if (const std::string link = TopicLink(name, typeName); !link.empty())
+        return link;
+    const auto point = name.find('.');
+    if (point == std::string::npos || !text::EqualsIgnoringCase(typeName, kMacro))
+        return name;
+    const std::string group = TopicLink(name.substr(0, point), typeName);
+    return group.empty() ? name : group + name.substr(point);
 }
 
 /// Tells a procedure's commands one after the other.
@@ -91,7 +95,7 @@ private:
     std::string SentenceOf(const CDoCmdParser& call) {
         const CXmlMessages& messages = *Session::Messages();
         if (call.ObjTypeName().empty())
-            return messages.GetMessageWithParams(call.MsgCode(), {NameAsHtml(call.ObjName())});
+            return messages.GetMessageWithParams(call.MsgCode(), {call.ObjName()});
         const std::string code = call.MsgCode() + " " + call.ObjTypeCode();
         const std::string own = messages.GetMessage(code + " " + std::string(kOwnName));
         // Without a name the object at hand is meant.
@@ -156,7 +160,7 @@ std::string DescriptionOfEvent(const HostObject& app, const HostObject& form, co
         return {};
     if (text::EqualsIgnoringCase(event, "[Event procedure]"))
         return DescriptionOfCode(module, ProcedureLines(module, ProcedureName(control)));
-    return Session::Messages()->GetMessageWithParams(kRunMacro, {MacroReference(event)});
+    return Session::Messages()->GetMessageWithParams(kRunMacro, {ReferenceTo(event, kMacro)});
 }
 
 } // namespace

@@ -3,7 +3,6 @@
 #include "foundation/NameEncoding.h"
 #include "foundation/Session.h"
 #include "host/access/LateBound.h"
-#include "host/access/NodeReference.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 
@@ -15,10 +14,20 @@ namespace {
 constexpr const char* kTable = "Table";
 constexpr std::int32_t kOneToOne = 1;
 
+std::string AsHtml(const std::string& name) {
+    return text::ReplaceAll(text::ReplaceAll(name, "&", "&amp;"), "<", "&lt;");
+}
+
 /// Base name of the table's topic; empty when it has none.
 std::string TopicOf(const std::string& table) {
     const CHelpPrjTree* tree = Session::HelpProjectTree();
     return tree == nullptr ? std::string() : tree->GetNodeHtmlFileNameNoExt(table, kTable);
+}
+
+std::string TableReference(const std::string& table) {
+    const CHelpPrjTree* tree = Session::HelpProjectTree();
+    const std::string reference = tree == nullptr ? std::string() : tree->GetNodeHtmlRef(table, kTable);
+    return reference.empty() ? AsHtml(table) : reference;
 }
 
 std::string FieldLinks(const HostObject& relation, const std::string& foreignTable) {
@@ -27,10 +36,10 @@ std::string FieldLinks(const HostObject& relation, const std::string& foreignTab
     late::ForEach(late::Object(relation, "Fields"), [&](const HostObject& field) {
         const std::string name = late::Text(field, "ForeignName");
         if (topic.empty())
-            links.push_back(NameAsHtml(name));
+            links.push_back(AsHtml(name));
         else
             links.push_back("<A href=\"" + topic + ".htm#" + NormalizeName(foreignTable) + "_" +
-                            NormalizeName(name) + "\">" + NameAsHtml(name) + "</A>");
+                            NormalizeName(name) + "\">" + AsHtml(name) + "</A>");
     });
     return text::Join(links, ", ");
 }
@@ -42,8 +51,8 @@ std::string RelationsHtml(const HostObject& app) {
     late::ForEach(late::Object(late::Object(app, "CurrentDb"), "Relations"), [&](const HostObject& relation) {
         const bool oneToOne = (late::Integer(relation, "Attributes") & kOneToOne) != 0;
         const std::string foreignTable = late::Text(relation, "ForeignTable");
-        lines.push_back("<H2>" + NodeReference(late::Text(relation, "Table"), kTable) + " -> " +
-                        NodeReference(foreignTable, kTable) + " (" + (oneToOne ? "1:1" : "1:N") + ", " +
+        lines.push_back("<H2>" + TableReference(late::Text(relation, "Table")) + " -> " +
+                        TableReference(foreignTable) + " (" + (oneToOne ? "1:1" : "1:N") + ", " +
                         FieldLinks(relation, foreignTable) + ")</H2>");
     });
     return text::Join(lines, "\r\n");
