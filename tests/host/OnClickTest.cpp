@@ -166,7 +166,7 @@ protected:
 
     void MakeModule() {
         const test::Fake module = test::MakeFake("CodeModule");
-        const auto line = [this](const auto& a, int number) -> Value {
+        const auto line = [](const auto& a, int number) -> Value {
             if (a.at(0).AsString() != "cmd_Go_1_Click")
                 throw RaisedError(35, "Sub or Function not defined", "CodeModule");
             return number;
