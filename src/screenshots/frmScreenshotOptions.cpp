@@ -54,6 +54,8 @@ void frmScreenshotOptions::SetLoadTimeValues() {
     ChoosePictureType(own ? options_.PictureSaveType : options_.ActiveProjectImageType());
     txtImageFileName.text = own ? options_.CapturedImageFileName() : options_.DefaultImageFileName();
     FillHTMLFields();
+    if (own && chkGenerateHTML.checked)
+        txtHTMLFileName.text = options_.HTMLFileName();
     Enable();
 }
 

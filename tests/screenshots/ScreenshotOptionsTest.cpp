@@ -145,6 +145,13 @@ TEST_F(ScreenshotOptionsTest, TheDialogOffersWhatCanBeSet) {
     form.GenerateHTMLClick(false);
     EXPECT_EQ(form.txtHTMLFolder.text + form.txtHTMLFileName.text, "");
     EXPECT_EQ(Opened().cmdOK.caption, "Take screenshot");
+
+    options.ScreenshotOptionsDefined = options.UserControlledScreenshotLocation = true;
+    options.SetDefaultFileNames(Options::kBitmap, "Mine");
+    options.SetHTMLFileName("Page.htm");
+    auto own = Opened();
+    EXPECT_EQ(own.txtImageFileName.text + " " + own.txtHTMLFileName.text, "Mine.bmp Page.htm");
+    EXPECT_TRUE(own.optBitmap.chosen);
 }
 
 TEST_F(ScreenshotOptionsTest, NamesFollowEachOther) {
