@@ -1,5 +1,6 @@
 #include "topics/CFormHTMLControlDefs.h"
 
+#include "foundation/Paths.h"
 #include "platform/text/Text.h"
 #include "topics/TopicTest.h"
 
@@ -141,6 +142,24 @@ TEST_F(ControlDefsTest, TablesAndWorksheetsFillTheirOwnTags) {
     ASSERT_EQ(kSuccess,
               form->SaveHTML4Worksheet(Path("t.htm"), "chart.htm", true, false, true, "", "", "<table>"));
     EXPECT_EQ("About|<table>|wbh", ReadFile(Path("t.htm")));
+}
+
+TEST_F(ControlDefsTest, EachKindHasATemplateThatIsFilledIn) {
+    SetInstallation(environment->files->FromNative(TOVIMAR_SOURCE_DIR "/install"));
+    CXmlMessages messages;
+    ASSERT_EQ(kSuccess, messages.Load(LocalizedFile("Messages.xml")));
+    Session::SetMessages(&messages);
+    for (const char* kind : {"Table", "Query", "Macro", "Worksheet", "Chart"}) {
+        auto form = Loaded("<" + std::string(kind) +
+                           " Name='Kind' Text='Kinds' Charset='utf-8' Description='About'/>");
+        ASSERT_EQ(kSuccess, form->SaveHTML4Worksheet(Path("k.htm"), text::ToLower(kind) + ".htm", false,
+                                                     false, true, "", "", "<table></table>"));
+        const std::string page = ReadFile(Path("k.htm"));
+        EXPECT_NE(std::string::npos, page.find("<h1>Kinds</h1>")) << kind;
+        EXPECT_NE(std::string::npos, page.find(">About</div>")) << kind;
+        EXPECT_EQ(std::string::npos, page.find("{{")) << kind << page;
+    }
+    EXPECT_NE(std::string::npos, ReadFile(Path("k.htm")).find("<table></table>"));
 }
 
 } // namespace
