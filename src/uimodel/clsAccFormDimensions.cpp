@@ -17,6 +17,8 @@ namespace {
 constexpr std::array<const char*, 5> kSectionNames{"Detail", "Header", "Footer", "PageHeader", "PageFooter"};
 constexpr std::int32_t kHeader = 1;
 constexpr std::int32_t kPageHeader = 3;
+/// Headers and footers of a report's ten levels of groups by turns.
+constexpr int kFirstGroupSection = 5, kLastGroupSection = 24;
 /// Section heights down to here mean that the section isn't there.
 constexpr double kAbsentHeight = -503;
 /// Containers nest less deeply; a way up that is longer runs in a circle.
@@ -62,6 +64,14 @@ platform::access::SectionHeights HeightsOf(const HostObject& form, View view) {
         if (heights.present[index])
             heights.pixels[index] = platform::access::RoundToEven(height / Metrics().twipsPerPixelY);
     }
+    if (form != nullptr && text::StartsWithIgnoringCase(form->ClassName(), "Report_"))
+        for (int section = kFirstGroupSection; section <= kLastGroupSection; ++section) {
+            const HostObject object = HostProperty::Object(form, "Section", {section});
+            const double height = HostProperty::Number(object, "Height", kAbsentHeight);
+            const bool visible = object != nullptr && HostProperty::Flag(object, "Visible");
+            if (height > kAbsentHeight && platform::access::SectionIsShown(view, section, visible))
+                heights.groups[section] = platform::access::RoundToEven(height / Metrics().twipsPerPixelY);
+        }
     return heights;
 }
 

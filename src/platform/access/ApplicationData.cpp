@@ -6,6 +6,7 @@
 #include "platform/access/QueryReader.h"
 #include "platform/access/QueryRunner.h"
 #include "platform/access/TableReader.h"
+#include "platform/access/ThemeReader.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
@@ -244,11 +245,32 @@ std::string ApplicationModel::FindPicture(const std::string& name) {
     return path && Env().files->FileExists(*path) ? Env().files->ReadFile(*path) : std::string();
 }
 
+/// Bytes of the theme that the database's properties name; empty where the source has none.
+std::string ApplicationModel::ThemeFile() {
+    const auto properties = folder_ + "\\dbs-properties.json";
+    if (!Env().files->FileExists(properties))
+        return {};
+    const auto name = JsonText(ReadText(properties), Env().files->ToNative(properties),
+                               {"Items", "Theme Resource Name", "Value"});
+    const auto path = folder_ + "\\themes\\" + name + ".thmx";
+    const bool plain = !name.empty() && name.find_first_of("\\/:") == std::string::npos;
+    return plain && Env().files->FileExists(path) ? Env().files->ReadFile(path) : std::string();
+}
+
 const std::vector<std::uint32_t>& ApplicationModel::ThemeColors() {
     // The palette "Office" that the host gives a new database.
     static const std::vector<std::uint32_t> kOffice = {0x000000, 0xFFFFFF, 0x1F497D, 0xEEECE1, 0x4F81BD,
                                                        0xC0504D, 0x9BBB59, 0x8064A2, 0x4BACC6, 0xF79646};
-    return kOffice;
+    if (!theme_.empty())
+        return theme_;
+    try {
+        theme_ = ReadThemeColors(ThemeFile());
+    } catch (const RaisedError&) {
+        theme_.clear(); // a damaged file of properties costs its colours, no more
+    }
+    if (theme_.empty())
+        theme_ = kOffice;
+    return theme_;
 }
 
 } // namespace tovimar::platform::access

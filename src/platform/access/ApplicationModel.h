@@ -114,6 +114,7 @@ private:
     Records ReadRecords(const std::string& recordSource, int rows, int depth);
     const Records* KnownRecords(const std::string& source, int rows, int depth);
     Records TableRecords(Table& table);
+    std::string ThemeFile();
     Records QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields, int rows,
                          int depth);
 
@@ -127,7 +128,8 @@ private:
     KeyedList<std::unique_ptr<Table>> tables_;
     KeyedList<std::unique_ptr<Query>> queries_;
     std::vector<RelationDefinition> relations_;
-    KeyedList<std::string> pictures_; ///< Windows paths by picture name
+    std::vector<std::uint32_t> theme_; ///< empty until it is asked for
+    KeyedList<std::string> pictures_;  ///< Windows paths by picture name
     std::vector<std::string> names_[6];
     bool kindInExports_[6] = {};
     std::unordered_map<std::string, std::unique_ptr<Records>> records_;

@@ -135,6 +135,18 @@ Value Format(const Data& arguments) {
     return value.IsNull() ? Datum::Text("") : Datum::Text(FormatDatum(value, format));
 }
 
+Value Choose(const Data& arguments) {
+    const auto at = CountOf(arguments, 0, 0);
+    return at >= 1 && at < arguments.size() ? arguments[at] : Datum{};
+}
+
+Value Switch(const Data& arguments) {
+    for (std::size_t i = 0; i + 1 < arguments.size(); i += 2)
+        if (arguments[i].IsTrue())
+            return arguments[i + 1];
+    return Datum{};
+}
+
 const std::unordered_map<std::string, Function>& Functions() {
     static const auto plain = [](double value, const Data&) { return value; };
     static const std::unordered_map<std::string, Function> functions = {
@@ -168,6 +180,8 @@ const std::unordered_map<std::string, Function>& Functions() {
                         : Datum::Number(static_cast<double>(text::Length(TextOf(a, 0))));
          }},
         {"format", Format},
+        {"choose", Choose},
+        {"switch", Switch},
         {"val", [](const Data& a) -> Value { return Datum::Number(std::atof(TextOf(a, 0).c_str())); }},
         {"cint", OfNumber([](double v, const Data&) { return std::nearbyint(v); })},
         {"clng", OfNumber([](double v, const Data&) { return std::nearbyint(v); })},

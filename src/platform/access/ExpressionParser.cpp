@@ -234,6 +234,12 @@ private:
                 node->word.pop_back();
             return TakeArguments(*node) ? std::move(node) : nullptr;
         }
+        // "[Customer].[Column](2)" is a name with the number as its last part.
+        if (name.size() > 1 && text::EqualsIgnoringCase(name.back(), "Column") &&
+            next_ + 2 < tokens_.size() && AtSymbol('(') && tokens_[next_ + 2].IsSymbol(')')) {
+            name.push_back(tokens_[next_ + 1].text);
+            next_ += 3;
+        }
         if (bare && name.size() == 1)
             if (auto constant = ConstantNamed(text::FoldCase(name[0])))
                 return Literal(std::move(*constant));

@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cstdint>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -41,6 +42,9 @@ Frame ComputeFrame(const SystemMetrics& metrics, const FrameInput& input);
 struct SectionHeights {
     std::array<int, 5> pixels{}; ///< 0 where absent
     std::array<bool, 5> present{};
+    /// Group sections of a report by their numbers from 5 on, absent ones left out. Headers lie above the
+    /// detail from the outermost in, footers below it from the innermost out.
+    std::map<int, int> groups;
 };
 /// Order from the top: header, page header, detail, page footer, footer.
 inline constexpr std::array<int, 5> kSectionOrder{1, 3, 0, 4, 2};

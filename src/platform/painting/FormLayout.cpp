@@ -24,6 +24,15 @@ int Extent(const SectionHeights& heights, int bar, std::size_t section, bool alw
     return heights.present[section] || always ? bar + heights.pixels[section] : 0;
 }
 
+/// Bars and heights of the group headers (odd numbers) or footers with numbers in [from, to).
+int GroupExtent(const SectionHeights& heights, int bar, bool headers, int from, int to) {
+    int extent = 0;
+    for (const auto& [number, height] : heights.groups)
+        if ((number % 2 == 1) == headers && number >= from && number < to)
+            extent += bar + height;
+    return extent;
+}
+
 double NaturalTabWidth(const SystemMetrics& metrics, const TabInput& input, std::size_t index) {
     const double weight = input.fontWeight >= kBoldFrom ? kBoldTabFactor : 1.0;
     const double scale = input.fontSize * weight / 8;
@@ -60,19 +69,28 @@ int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int sect
     const auto extent = [&](std::size_t index, bool always = false) {
         return Extent(heights, sectionBarHeight, index, always);
     };
+    constexpr int kFirst = 5, kEnd = 1000;
+    const auto headers = [&](int to) { return GroupExtent(heights, sectionBarHeight, true, kFirst, to); };
+    const auto footers = [&](int from) { return GroupExtent(heights, sectionBarHeight, false, from, kEnd); };
+    const auto body = [&] { return headers(kEnd) + extent(0, true) + footers(kFirst); };
     switch (section) {
     case 3:
         return extent(1);
     case 0:
-        return extent(1) + extent(3);
+        return extent(1) + extent(3) + headers(kEnd);
     case 4:
-        return extent(1) + extent(3, true) + extent(0, true);
+        return extent(1) + extent(3, true) + body();
     case 2:
         // Page sections come in pairs: the page header speaks for the footer as well.
-        return extent(1) + extent(3) + extent(0, true) + (heights.present[3] ? extent(4, true) : 0);
+        return extent(1) + extent(3) + body() + (heights.present[3] ? extent(4, true) : 0);
     default:
-        return 0;
+        break;
     }
+    if (heights.groups.count(section) == 0)
+        return 0;
+    const int above = extent(1) + extent(3);
+    return section % 2 == 1 ? above + headers(section)
+                            : above + headers(kEnd) + extent(0, true) + footers(section + 1);
 }
 
 Rectangle ControlRectangle(const SystemMetrics& metrics, const Frame& frame, int sectionOffset, double left,

@@ -22,10 +22,6 @@ constexpr int kUsualRecords = 6;
 constexpr int kUsualHeight = 400;
 constexpr int kPrintOnly = 1, kScreenOnly = 2;
 
-bool HasContent(const SectionRef& section) {
-    return !section.object->children.empty() || section.object->Integer("Height", 0) > 0;
-}
-
 int SectionPixels(const Design& design, int number, const SystemMetrics& metrics) {
     const auto* section = design.Section(number);
     return section == nullptr ? 0 : PixelsOf(*section, "Height", metrics.twipsPerPixelY);
@@ -133,8 +129,12 @@ int ShownRecordsOf(const Design& design, View view, int insideHeight, const Syst
 SectionHeights HeightsOf(const Design& design, View view, int records, const SystemMetrics& metrics) {
     SectionHeights heights;
     for (const auto& section : design.Sections()) {
-        if (section.number > 4 || !IsSectionShown(design, section, view))
+        if (!IsSectionShown(design, section, view))
             continue;
+        if (section.number > 4) {
+            heights.groups[section.number] = PixelsOf(*section.object, "Height", metrics.twipsPerPixelY);
+            continue;
+        }
         const auto at = static_cast<std::size_t>(section.number);
         heights.present[at] = true;
         const double twips =
@@ -146,28 +146,19 @@ SectionHeights HeightsOf(const Design& design, View view, int records, const Sys
 }
 
 std::vector<PlacedSection> PlacedSections(const Design& design, View view, const SectionHeights& heights,
-                                          int barHeight, const SystemMetrics& metrics) {
+                                          int barHeight) {
     std::vector<PlacedSection> placed;
     for (const auto& section : design.Sections()) {
         if (!IsSectionShown(design, section, view))
             continue;
-        const bool plain = section.number <= 4;
-        if (!plain && !HasContent(section))
-            continue;
-        placed.push_back({section.number, section.object, 0,
-                          plain ? heights.pixels[static_cast<std::size_t>(section.number)]
-                                : PixelsOf(*section.object, "Height", metrics.twipsPerPixelY)});
+        const int height = section.number <= 4 ? heights.pixels[static_cast<std::size_t>(section.number)]
+                                               : heights.groups.at(section.number);
+        placed.push_back({section.number, section.object,
+                          access::SectionOffsetY(heights, barHeight, section.number), height});
     }
     std::stable_sort(placed.begin(), placed.end(), [](const PlacedSection& left, const PlacedSection& right) {
         return PrintOrder(left.number) < PrintOrder(right.number);
     });
-    const bool grouped =
-        std::any_of(placed.begin(), placed.end(), [](const auto& section) { return section.number > 4; });
-    int offset = 0;
-    for (auto& section : placed) {
-        section.offset = grouped ? offset : access::SectionOffsetY(heights, barHeight, section.number);
-        offset += barHeight + section.height;
-    }
     return placed;
 }
 

@@ -29,11 +29,9 @@ struct PlacedSection {
     int offset = 0; ///< of the bar
     int height = 0; ///< of the content
 };
-/// From the top. Forms have their sections where the hot spots expect them; a report's group sections stand
-/// between its page sections as they are printed.
+/// From the top, where the hot spots expect them.
 std::vector<PlacedSection> PlacedSections(const access::Design& design, access::View view,
-                                          const access::SectionHeights& heights, int barHeight,
-                                          const SystemMetrics& metrics);
+                                          const access::SectionHeights& heights, int barHeight);
 /// "Detail", "Form Header", "Category Footer", ...
 std::string SectionTitle(const access::Design& design, int number);
 

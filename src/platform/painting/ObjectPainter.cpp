@@ -71,8 +71,7 @@ void ObjectPainter::PaintForm(const Rectangle& area) {
     const int records = ShownRecordsOf(design, context_.view, area.Height(), context_.metrics);
     const auto heights = HeightsOf(design, context_.view, records, context_.metrics);
     const ClipTo clip(canvas_, inner);
-    for (const auto& section :
-         PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
+    for (const auto& section : PlacedSections(design, context_.view, heights, frame_.sectionBarHeight)) {
         if (section.number == 0)
             PaintRecords(section, inner, records);
         else
@@ -125,8 +124,7 @@ void ObjectPainter::PaintDesign(const Rectangle& area) {
     canvas_.Fill(area, 0xC4C8CD);
     const auto heights = HeightsOf(design, context_.view, 1, context_.metrics);
     const int width = PixelsOf(*design.root, "Width", context_.metrics.twipsPerPixelX);
-    for (const auto& section :
-         PlacedSections(design, context_.view, heights, frame_.sectionBarHeight, context_.metrics)) {
+    for (const auto& section : PlacedSections(design, context_.view, heights, frame_.sectionBarHeight)) {
         const int top = area.top + section.offset;
         const int content = top + frame_.sectionBarHeight;
         PaintSectionBar(canvas_, {area.left, top, area.right, content}, SectionTitle(design, section.number));

@@ -95,6 +95,8 @@ public:
             return Named(name[0], row);
         if (const auto value = InSubform(name))
             return value;
+        if (name.size() > 2 && text::EqualsIgnoringCase(name[name.size() - 2], "Column"))
+            return InList(name[name.size() - 3], name.back(), row);
         const bool own =
             text::EqualsIgnoringCase(name[0], "Me") ||
             (name.size() > 2 && text::EqualsIgnoringCase(name[name.size() - 2], data_.design_.name));
@@ -142,6 +144,19 @@ private:
         const auto* control = inner.FindControl(name.back());
         return control == nullptr ? inner.FieldValue(name.back(), 0)
                                   : std::optional<Datum>(inner.ValueOf(*control, 0));
+    }
+
+    /// A column, counted from 0, of the row that a combo box shows.
+    std::optional<Datum> InList(const std::string& combo, const std::string& column, int row) const {
+        const auto* control = data_.FindControl(combo);
+        const auto at = Datum::Text(column).AsNumber();
+        const auto* cells =
+            control == nullptr ? nullptr : data_.ListRow(*control, data_.ValueOf(*control, row).AsText());
+        if (cells == nullptr || !at || *at < 0 || *at >= static_cast<double>(cells->size()))
+            return std::nullopt;
+        const auto& cell = (*cells)[static_cast<std::size_t>(*at)];
+        const auto number = Datum::Text(cell).AsNumber();
+        return number ? Datum::Number(*number) : cell.empty() ? Datum{} : Datum::Text(cell);
     }
 
     const SampleData& data_;
@@ -379,6 +394,19 @@ const Records* SampleData::RowSource(const DesignObject& control) const {
     return application_->FindRecords(source, kMostRecords);
 }
 
+/// The row of a list's source whose bound column holds a value; null when there is none.
+const std::vector<std::string>* SampleData::ListRow(const DesignObject& list,
+                                                    const std::string& value) const {
+    const auto* records = RowSource(list);
+    if (records == nullptr)
+        return nullptr;
+    const auto bound = static_cast<std::size_t>(std::max(1, list.Integer("BoundColumn", 1))) - 1;
+    for (const auto& cells : records->rows)
+        if (bound < cells.size() && text::EqualsIgnoringCase(cells[bound], value))
+            return &cells;
+    return nullptr;
+}
+
 /// What a combo box shows for a value: the column shown of the row whose bound column holds the value.
 /// A value that is known and isn't in the list shows nothing.
 std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value, int row,
@@ -397,9 +425,8 @@ std::string SampleData::LookedUp(const DesignObject& combo, const std::string& v
     }
     const auto* records = RowSource(combo);
     if (records != nullptr && !records->rows.empty()) {
-        for (const auto& cells : records->rows)
-            if (bound < cells.size() && shown < cells.size() && text::EqualsIgnoringCase(cells[bound], value))
-                return cells[shown];
+        if (const auto* cells = ListRow(combo, value))
+            return shown < cells->size() ? (*cells)[shown] : std::string();
         if (known)
             return {};
         const auto& cells = records->rows[static_cast<std::size_t>(std::max(0, row)) % records->rows.size()];

@@ -62,6 +62,7 @@ private:
     std::string LookedUp(const access::DesignObject& combo, const std::string& value, int row,
                          bool known) const;
     const access::Records* RowSource(const access::DesignObject& control) const;
+    const std::vector<std::string>* ListRow(const access::DesignObject& list, const std::string& value) const;
     const access::DesignObject* FindControl(std::string_view name) const;
     void KeepLinked(const std::vector<RecordLink>& links);
     void SortByGroups();
