@@ -50,6 +50,16 @@ Frame FrameOf(const HostObject& form, View view, bool rulerOn) {
     return platform::access::ComputeFrame(Metrics(), input);
 }
 
+/// A host that prints sections elsewhere than its design has them tells where.
+void TakePrintedPlaces(const HostObject& form, platform::access::SectionHeights& heights) {
+    for (int section = 0; section <= kLastGroupSection; ++section) {
+        const HostObject object = HostProperty::Object(form, "Section", {section});
+        if (object != nullptr && HostProperty::Readable(object, "PrintedTop"))
+            heights.printed[section] = {HostProperty::Integer(object, "PrintedLeft"),
+                                        HostProperty::Integer(object, "PrintedTop")};
+    }
+}
+
 platform::access::SectionHeights HeightsOf(const HostObject& form, View view) {
     platform::access::SectionHeights heights;
     for (const int section : platform::access::kSectionOrder) {
@@ -64,6 +74,8 @@ platform::access::SectionHeights HeightsOf(const HostObject& form, View view) {
         if (heights.present[index])
             heights.pixels[index] = platform::access::RoundToEven(height / Metrics().twipsPerPixelY);
     }
+    if (view == View::Preview)
+        TakePrintedPlaces(form, heights);
     if (form != nullptr && text::StartsWithIgnoringCase(form->ClassName(), "Report_"))
         for (int section = kFirstGroupSection; section <= kLastGroupSection; ++section) {
             const HostObject object = HostProperty::Object(form, "Section", {section});
@@ -191,10 +203,14 @@ platform::Rectangle clsAccFormDimensions::ControlRectangle(const HostObject& con
     const Answer& answer = OfControl(control, vfRulerOn);
     const int offset = platform::access::SectionOffsetY(answer.heights, answer.frame.sectionBarHeight,
                                                         SectionNumber(control));
-    return platform::access::ControlRectangle(
+    auto place = platform::access::ControlRectangle(
         Metrics(), answer.frame, offset, HostProperty::Number(control, "Left"),
         HostProperty::Number(control, "Top"), HostProperty::Number(control, "Width"),
         HostProperty::Number(control, "Height"));
+    const int right = platform::access::SectionOffsetX(answer.heights, SectionNumber(control));
+    place.left += right;
+    place.right += right;
+    return place;
 }
 
 platform::access::TabInput clsAccFormDimensions::ReadTabs(const HostObject& tabControl) {

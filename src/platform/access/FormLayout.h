@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <map>
 #include <string>
+#include <utility>
 #include <vector>
 
 /// Where things lie in an open form's or report's window, in pixels. The painter and the geometry of hot
@@ -45,6 +46,9 @@ struct SectionHeights {
     /// Group sections of a report by their numbers from 5 on, absent ones left out. Headers lie above the
     /// detail from the outermost in, footers below it from the innermost out.
     std::map<int, int> groups;
+    /// Where a preview prints the first of each section, left and top within the client area. Empty in other
+    /// views.
+    std::map<int, std::pair<int, int>> printed;
 };
 /// Order from the top: header, page header, detail, page footer, footer.
 inline constexpr std::array<int, 5> kSectionOrder{1, 3, 0, 4, 2};
@@ -64,6 +68,8 @@ constexpr bool SectionIsShown(View view, int section, bool visible) {
 }
 /// What lies above a section within the client area: bars and heights of the sections above it.
 int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int section);
+/// 0 but on a printed sheet.
+int SectionOffsetX(const SectionHeights& heights, int section);
 
 /// A control's place, relative to the client area's origin (add the frame's client offset for the place
 /// in the window's picture). Twips in, pixels out. `sectionOffset` and `sectionBarHeight` are those of its

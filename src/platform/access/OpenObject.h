@@ -59,6 +59,9 @@ struct OpenObject {
     /// view, and header and footer of a datasheet are absent. The detail of a continuous form counts all
     /// records shown, so that its footer's controls lie below the last of them.
     SectionHeights Sections(const SystemMetrics& metrics) const;
+    /// Left and top of the first of each section that a preview prints, within the client area; of a report
+    /// within a report from its frame. Empty in other views.
+    std::map<int, std::pair<int, int>> PrintedSections(const SystemMetrics& metrics, bool nested) const;
     /// Records shown below each other: 1 but in the form view of a continuous form.
     int ShownRecords(const SystemMetrics& metrics) const;
 };

@@ -10,6 +10,8 @@ const MemberTable<SectionObject>& SectionObject::Members() {
     static const MemberTable<SectionObject> kMembers{{"Name", &SectionObject::ReadName},
                                                      {"Height", &SectionObject::ReadHeight},
                                                      {"Section", &SectionObject::ReadNumber},
+                                                     {"PrintedLeft", &SectionObject::ReadPrintedLeft},
+                                                     {"PrintedTop", &SectionObject::ReadPrintedTop},
                                                      {"Properties", &SectionObject::ReadProperties}};
     return kMembers;
 }
@@ -19,6 +21,14 @@ Value SectionObject::ReadHeight(const Arguments&) {
     if (!window)
         RaiseObjectClosed(ClassName());
     return window->SectionHeight(*design_, number_);
+}
+
+std::pair<int, int> SectionObject::PrintedPlace() {
+    const auto window = window_.lock();
+    const auto* place = window ? window->PrintedPlace(number_) : nullptr;
+    if (place == nullptr)
+        RaiseNoSuchMember(ClassName());
+    return *place;
 }
 
 Value SectionObject::ReadOther(std::string_view name, const Arguments&) {

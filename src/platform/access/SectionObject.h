@@ -25,6 +25,11 @@ protected:
 private:
     Value ReadHeight(const Arguments&);
     Value ReadName(const Arguments&) { return design_->name; }
+    Value ReadPrintedLeft(const Arguments&) { return PrintedPlace().first; }
+    Value ReadPrintedTop(const Arguments&) { return PrintedPlace().second; }
+    /// Pixels in the client area of a preview. Raises 438 in other views and for a section that isn't
+    /// printed.
+    std::pair<int, int> PrintedPlace();
     Value ReadNumber(const Arguments&) { return number_; }
     Value ReadProperties(const Arguments& arguments);
 

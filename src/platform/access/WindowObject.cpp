@@ -169,13 +169,22 @@ std::int32_t WindowObject::DatasheetPosition(const DesignObject& control) const 
 
 std::int32_t WindowObject::SectionHeight(const DesignObject& section, std::int32_t number) const {
     const auto twips = section.Integer("Height");
+    if (open_.view != View::Form)
+        return twips;
     const auto& metrics = Env().windows->Metrics();
     const auto shown = open_.Sections(metrics);
     const auto index = static_cast<std::size_t>(number);
-    if (open_.view != View::Form || index >= shown.pixels.size())
+    if (index >= shown.pixels.size())
         return twips;
     const int pixels = RoundToEven(static_cast<double>(twips) / metrics.twipsPerPixelY);
     return pixels == shown.pixels[index] ? twips : shown.pixels[index] * metrics.twipsPerPixelY;
+}
+
+const std::pair<int, int>* WindowObject::PrintedPlace(std::int32_t section) {
+    if (!printed_)
+        printed_ = open_.PrintedSections(Env().windows->Metrics(), nested_);
+    const auto found = printed_->find(section);
+    return found == printed_->end() ? nullptr : &found->second;
 }
 
 Value WindowObject::ReadOther(std::string_view name, const Arguments&) {

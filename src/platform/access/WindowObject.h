@@ -48,6 +48,9 @@ public:
     /// Twips; in form view what is shown of the section, which for a continuous form are several records.
     std::int32_t SectionHeight(const DesignObject& section, std::int32_t number) const;
 
+    /// Where a preview prints the first of a section; null in other views.
+    const std::pair<int, int>* PrintedPlace(std::int32_t section);
+
 protected:
     Value ReadOther(std::string_view name, const Arguments& arguments) override;
     void WriteOther(std::string_view name, const Value& value) override;
@@ -87,6 +90,7 @@ private:
     std::unordered_map<const DesignObject*, std::shared_ptr<ControlObject>> byDesign_;
     std::unordered_map<const DesignObject*, std::int32_t> sections_;
     std::unordered_map<std::int32_t, HostObject> sectionObjects_;
+    std::optional<std::map<int, std::pair<int, int>>> printed_; ///< none until it is asked for
     std::shared_ptr<OwnerProperties> properties_;
 };
 

@@ -69,6 +69,9 @@ int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int sect
     const auto extent = [&](std::size_t index, bool always = false) {
         return Extent(heights, sectionBarHeight, index, always);
     };
+    // Nothing printed has a bar; controls count from one.
+    if (const auto printed = heights.printed.find(section); printed != heights.printed.end())
+        return printed->second.second - sectionBarHeight;
     constexpr int kFirst = 5, kEnd = 1000;
     const auto headers = [&](int to) { return GroupExtent(heights, sectionBarHeight, true, kFirst, to); };
     const auto footers = [&](int from) { return GroupExtent(heights, sectionBarHeight, false, from, kEnd); };
@@ -91,6 +94,11 @@ int SectionOffsetY(const SectionHeights& heights, int sectionBarHeight, int sect
     const int above = extent(1) + extent(3);
     return section % 2 == 1 ? above + headers(section)
                             : above + headers(kEnd) + extent(0, true) + footers(section + 1);
+}
+
+int SectionOffsetX(const SectionHeights& heights, int section) {
+    const auto printed = heights.printed.find(section);
+    return printed == heights.printed.end() ? 0 : printed->second.first;
 }
 
 Rectangle ControlRectangle(const SystemMetrics& metrics, const Frame& frame, int sectionOffset, double left,

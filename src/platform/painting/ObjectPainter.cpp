@@ -168,20 +168,13 @@ void ObjectPainter::PaintPreview(const Rectangle& area) {
 
 void ObjectPainter::PaintPrintedBody(const Rectangle& area) {
     PaintFormBackground(area);
-    const auto page = PlanReportPage(context_.design, sample_, context_.metrics);
-    const auto* pageHeader = context_.design.Section(3);
-    const auto* pageFooter = context_.design.Section(4);
-    int top = area.top;
-    for (const auto& section : page.sections) {
-        // A report within a page has no pages of its own.
-        if (section.object == pageHeader || section.object == pageFooter)
-            continue;
+    for (const auto& section : PlanPrintedBody(context_.design, sample_, context_.metrics)) {
+        const int top = area.top + section.top;
         const Rectangle place{area.left, top, area.right, top + section.height};
         const auto ground = GroundOf(*section.object, section.alternate);
         canvas_.Fill(place, ground);
         sample_.LimitAggregates(section.firstAdded, section.added);
         PaintControls(*section.object, area.left, top, place, section.row, ground);
-        top += section.height;
     }
 }
 

@@ -1,6 +1,8 @@
 #include "platform/access/OpenObject.h"
 
 #include "platform/painting/ObjectLayout.h"
+#include "platform/painting/ReportPage.h"
+#include "platform/painting/SampleData.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
@@ -45,7 +47,27 @@ int OpenObject::ShownRecords(const SystemMetrics& metrics) const {
 }
 
 SectionHeights OpenObject::Sections(const SystemMetrics& metrics) const {
-    return painting::HeightsOf(*design, view, ShownRecords(metrics), metrics);
+    auto heights = painting::HeightsOf(*design, view, ShownRecords(metrics), metrics);
+    heights.printed = PrintedSections(metrics, false);
+    return heights;
+}
+
+std::map<int, std::pair<int, int>> OpenObject::PrintedSections(const SystemMetrics& metrics,
+                                                               bool nested) const {
+    std::map<int, std::pair<int, int>> places;
+    if (view != View::Preview || design == nullptr || !design->root)
+        return places;
+    const painting::SampleData sample(*design, application);
+    auto page = painting::PlanReportPage(*design, sample, metrics);
+    if (nested)
+        page.sections = painting::PlanPrintedBody(*design, sample, metrics);
+    const int left = nested ? 0 : painting::kDeskMargin + page.left, top = nested ? 0 : painting::kDeskMargin;
+    std::map<const DesignObject*, int> numbers;
+    for (const auto& section : design->Sections())
+        numbers[section.object] = section.number;
+    for (const auto& section : page.sections)
+        places.emplace(numbers[section.object], std::pair(left, top + section.top));
+    return places;
 }
 
 std::vector<const DesignObject*> DatasheetColumns(const Design& design) {

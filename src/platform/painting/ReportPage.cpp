@@ -147,4 +147,20 @@ ReportPage PlanReportPage(const Design& design, const SampleData& sample, const 
     return Planner(design, sample, metrics).Plan();
 }
 
+std::vector<PrintedSection> PlanPrintedBody(const Design& design, const SampleData& sample,
+                                            const SystemMetrics& metrics) {
+    auto sections = PlanReportPage(design, sample, metrics).sections;
+    // A report within a page has no pages of its own.
+    const auto *header = design.Section(3), *footer = design.Section(4);
+    std::erase_if(sections, [&](const PrintedSection& section) {
+        return section.object == header || section.object == footer;
+    });
+    int top = 0;
+    for (auto& section : sections) {
+        section.top = top;
+        top += section.height;
+    }
+    return sections;
+}
+
 } // namespace tovimar::platform::painting

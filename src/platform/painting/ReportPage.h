@@ -29,6 +29,10 @@ class SampleData;
 ReportPage PlanReportPage(const access::Design& design, const SampleData& sample,
                           const SystemMetrics& metrics);
 
+/// What a report within a page prints: sections without those of the page, one below the other from 0.
+std::vector<PrintedSection> PlanPrintedBody(const access::Design& design, const SampleData& sample,
+                                            const SystemMetrics& metrics);
+
 /// Grey ground around the sheet.
 inline constexpr int kDeskMargin = 14;
 

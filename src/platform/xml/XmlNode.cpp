@@ -81,7 +81,11 @@ std::string XmlNode::nodeName() const {
 std::string XmlNode::baseName() const {
     const std::string_view name = Wrap(node_).name();
     const auto colon = name.find(':');
-    return std::string(colon == std::string_view::npos ? name : name.substr(colon + 1));
+    const std::string_view local = colon == std::string_view::npos ? name : name.substr(colon + 1);
+    // What can't be a name by itself has no prefix in front.
+    const bool isName =
+        !local.empty() && std::string_view("0123456789-.:").find(local[0]) == std::string_view::npos;
+    return std::string(isName ? local : name);
 }
 
 XmlNode XmlNode::parent() const {

@@ -187,6 +187,34 @@ INSTANTIATE_TEST_SUITE_P(Applications, GeometryTest,
                          ::testing::Values("samples/orchard", "../shared/corpus/sports-admin",
                                            "../shared/corpus/vcs-testing"));
 
+TEST(Geometry, APreviewTellsWhereItPrintsASection) {
+    const auto report =
+        ReadDesign("Begin Report\nWidth =6000\nBegin\nBegin BreakLevel\nControlSource =\"A\"\nEnd\n"
+                   "Begin PageHeader\nHeight =600\nBegin\nBegin Label\nLeft =150\nTop =75\nWidth =900\nName "
+                   "=\"H\"\nEnd\nEnd\nEnd\n"
+                   "Begin BreakHeader\nHeight =450\nBegin\nBegin Label\nLeft =300\nTop =90\nWidth =900\nName "
+                   "=\"G\"\nEnd\nEnd\nEnd\n"
+                   "Begin Section\nHeight =300\nBegin\nBegin TextBox\nLeft =450\nTop =15\nWidth =900\nName "
+                   "=\"D\"\nEnd\nEnd\nEnd\n"
+                   "End\nEnd\n",
+                   ObjectKind::Report, "R", "R.txt");
+    Boxes boxed(*report);
+    OpenedWindow window(*report, nullptr, View::Preview);
+    const auto picture = window.Picture();
+    for (const auto& section : report->Sections())
+        for (const auto& control : section.object->children) {
+            const auto place = window.PlaceOf(*control, section.number);
+            const auto at = [&](int x, int y) {
+                return picture.pixels[static_cast<std::size_t>(y) * static_cast<std::size_t>(picture.width) +
+                                      static_cast<std::size_t>(x)];
+            };
+            EXPECT_EQ(at(place.left, place.top), Boxes::ColorOf(*control)) << control->name;
+            EXPECT_EQ(at(place.right - 1, place.bottom - 1), Boxes::ColorOf(*control)) << control->name;
+            EXPECT_NE(at(place.left - 1, place.top), Boxes::ColorOf(*control)) << control->name;
+            EXPECT_NE(at(place.left, place.top - 1), Boxes::ColorOf(*control)) << control->name;
+        }
+}
+
 TEST(Geometry, FramesBarsSelectorsAndGroupsMoveAreasAndControlsAlike) {
     for (const int border : {0, 1, 2, 3})
         for (const bool selectors : {true, false}) {

@@ -80,13 +80,14 @@ public:
     }
     platform::Rectangle PlaceOf(const platform::access::DesignObject& control, int section) const {
         const auto frame = platform::access::ComputeFrame(windows.Metrics(), object.FrameSettings());
-        const int offset = platform::access::SectionOffsetY(object.Sections(windows.Metrics()),
-                                                            frame.sectionBarHeight, section);
+        const auto heights = object.Sections(windows.Metrics());
+        const int offset = platform::access::SectionOffsetY(heights, frame.sectionBarHeight, section);
+        const int right = platform::access::SectionOffsetX(heights, section);
         auto place = platform::access::ControlRectangle(windows.Metrics(), frame, offset,
                                                         control.Integer("Left"), control.Integer("Top"),
                                                         control.Integer("Width"), control.Integer("Height"));
-        place.left += frame.ClientOffsetX();
-        place.right += frame.ClientOffsetX();
+        place.left += frame.ClientOffsetX() + right;
+        place.right += frame.ClientOffsetX() + right;
         place.top += frame.ClientOffsetY();
         place.bottom += frame.ClientOffsetY();
         return place;
