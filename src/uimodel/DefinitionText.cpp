@@ -48,6 +48,8 @@ std::string Escaped(std::string_view value) {
             escaped += "&lt;";
         else if (c == '"')
             escaped += "&quot;";
+        else if (static_cast<unsigned char>(c) < ' ')
+            escaped.append("&#").append(std::to_string(c)).append(";");
         else
             escaped += c;
     }

@@ -208,6 +208,16 @@ TEST_F(DefinitionTest, HotSpotsAddTheClientAreaAndEndAtTheGreatestNumber) {
     EXPECT_EQ("a", control.Properties("BOOKMARKNAME").AsString());
 }
 
+TEST_F(DefinitionTest, WhatIsSavedLoadsAgainWhateverItsAttributesHold) {
+    for (const std::string& xml :
+         {std::string("<Form Name='F' Text='F' HtmlFileName='a&#6;b&#10;.htm' Charset='&#1;\t'/>"),
+          WithControls("<ListBo: Name='a'/><x:1 Name='b'/><Text:Box Name='c'/>")}) {
+        const std::string saved = Loaded(xml)->XMLSTr();
+        EXPECT_EQ(Loaded(saved)->XMLSTr(), saved);
+    }
+    EXPECT_EQ(Loaded(WithControls("<ListBo: Name='a'/>"))->Controls.At(1)->ElementName(), "ListBo:");
+}
+
 TEST_F(DefinitionTest, CaptionsLoseTheirColon) {
     CXmlControl control;
     for (const auto& [text, caption] : std::vector<std::pair<std::string, std::string>>{
