@@ -84,10 +84,12 @@ bool Datum::IsTrue() const {
 std::optional<int> Compare(const Datum& left, const Datum& right) {
     if (left.IsNull() || right.IsNull())
         return std::nullopt;
-    const auto a = left.AsNumber(), b = right.AsNumber();
     const bool texts = left.kind == Datum::Kind::Text && right.kind == Datum::Kind::Text;
-    if (a && b && !texts)
+    const auto a = texts ? std::nullopt : left.AsNumber(), b = texts ? std::nullopt : right.AsNumber();
+    if (a && b)
         return *a < *b ? -1 : *a > *b ? 1 : 0;
+    if (texts)
+        return text::CompareIgnoringCase(left.text, right.text);
     const auto order = text::FoldCase(left.AsText()).compare(text::FoldCase(right.AsText()));
     return order < 0 ? -1 : order > 0 ? 1 : 0;
 }

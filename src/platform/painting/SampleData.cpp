@@ -250,19 +250,27 @@ void SampleData::SortByGroups() {
         if (column >= 0)
             columns.emplace_back(static_cast<std::size_t>(column), child->Flag("SortOrder"));
     }
-    const auto cell = [&](int row, std::size_t column) {
-        const auto& cells = records_->rows[static_cast<std::size_t>(row)];
-        return column < cells.size() ? access::DatumOf(cells[column], records_->columns[column].type)
-                                     : Datum{};
-    };
-    std::stable_sort(rows_.begin(), rows_.end(), [&](int left, int right) {
+    if (columns.empty())
+        return;
+    std::vector<std::vector<Datum>> keys(records_->rows.size());
+    for (const int row : rows_) {
+        const auto at = static_cast<std::size_t>(row);
         for (const auto& [column, descending] : columns) {
-            const auto a = cell(left, column), b = cell(right, column);
+            const auto& cells = records_->rows[at];
+            const auto type = records_->columns[column].type;
+            keys[at].push_back(column < cells.size() ? access::DatumOf(cells[column], type) : Datum{});
+        }
+    }
+    std::stable_sort(rows_.begin(), rows_.end(), [&](int left, int right) {
+        for (std::size_t i = 0; i < columns.size(); ++i) {
+            const auto& a = keys[static_cast<std::size_t>(left)][i];
+            const auto& b = keys[static_cast<std::size_t>(right)][i];
+            // Nulls come first.
             const int order = a.IsNull() || b.IsNull()
                                   ? static_cast<int>(b.IsNull()) - static_cast<int>(a.IsNull())
-                                  : -access::Compare(a, b).value_or(0);
+                                  : access::Compare(a, b).value_or(0);
             if (order != 0)
-                return descending ? order < 0 : order > 0;
+                return columns[i].second ? order > 0 : order < 0;
         }
         return false;
     });
