@@ -78,6 +78,11 @@ std::string LogFolder() {
     return Redirected("Log.rdt", Env().folders.program);
 }
 
+std::string PassingFolder() {
+    const auto& folders = Env().folders;
+    return WithTrailingBackslash(folders.passing.empty() ? folders.temporary : folders.passing);
+}
+
 std::string TemporaryFolder() {
     return WithTrailingBackslash(Env().folders.temporary);
 }

@@ -17,6 +17,8 @@ std::string WizardDefinitionFile();
 std::string CataloguePath();
 std::string LogFolder();
 std::string TemporaryFolder();
+/// Where a file goes that is read back and deleted at once.
+std::string PassingFolder();
 /// "vasmora.chm" in the program's folder: the help of the system itself.
 std::string OwnHelpFile();
 

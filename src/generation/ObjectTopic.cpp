@@ -121,8 +121,7 @@ void ObjectTopic::TakeOver() {
         return;
     const std::int32_t window = host.ActivateComponent(type_, node_.Name(), /*forceOpenInDesignView=*/false,
                                                        /*forceOpenAsHidden=*/false);
-    Screenshot().LocateObjectsAndTakeScreenshots(generator_.Parameters().ImagesType(), window,
-                                                 form_->XMLSTr());
+    Screenshot().LocateObjectsAndTakeScreenshots(generator_.Parameters().ImagesType(), window, *form_);
     ++Stats().ScreenshotsQty;
 }
 

@@ -3,6 +3,7 @@
 #include "platform/Value.h"
 
 #include <initializer_list>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -27,6 +28,12 @@ public:
     virtual void Set(std::string_view member, const Value& value) = 0;
     /// Calls a method; missing trailing arguments take the host's defaults.
     virtual Value Call(std::string_view member, const Arguments& arguments = {}) = 0;
+
+    /// Reads a property where that may well fail: none instead of an error. Most objects answer without
+    /// raising one inside, which is what makes asking every control for a property that few have cheap.
+    virtual std::optional<Value> Find(std::string_view member, const Arguments& arguments = {});
+    /// The value of an entry of `Properties`, none where there isn't one.
+    virtual std::optional<Value> FindProperty(const std::string& name);
 
     /// Identity of the object behind the reference: two references to one control are the same.
     virtual const void* Identity() const { return this; }

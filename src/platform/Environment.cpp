@@ -123,6 +123,9 @@ KnownFolders MakeFolders(FileSystem& files, const std::string& programFolder) {
     const std::string temporary = Variable("TMPDIR");
     KnownFolders folders;
     folders.temporary = WithTrailingBackslash(files.FromNative(temporary.empty() ? "/tmp" : temporary));
+    constexpr const char* kMemory = "/dev/shm";
+    if (temporary.empty() && access(kMemory, W_OK | X_OK) == 0)
+        folders.passing = WithTrailingBackslash(files.FromNative(kMemory));
     folders.applicationData = "C:\\Application Data\\";
     folders.programFiles = "C:\\Program Files\\";
     folders.program =

@@ -131,6 +131,9 @@ public:
 /// Known folders, as Windows paths with a trailing backslash.
 struct KnownFolders {
     std::string temporary;
+    /// For files that are read back and deleted at once: in memory where the machine has a folder for that,
+    /// since a disk's file system remembers every one of them. Empty: `temporary`.
+    std::string passing;
     std::string applicationData;
     std::string programFiles;
     /// The folder of the running program; the installation folder falls back on it.

@@ -68,6 +68,10 @@ public:
                                                const std::string& vstrXml,
                                                const std::string& vstrPicsFolder = {});
 
+    /// The same from a definition that is at hand: its paths become those of the pictures taken.
+    ResultCode LocateObjectsAndTakeScreenshots(const std::string& vstrPicType, std::int32_t vlngHwnd,
+                                               CXmlForm& form, const std::string& vstrPicsFolder = {});
+
     /// What one shot of an object is told.
     struct Shot {
         std::int32_t objectType = 0;
@@ -95,7 +99,7 @@ private:
     struct Target;
     struct Place;
 
-    void TakeAll(const std::string& vstrPicType, std::int32_t vlngHwnd, const std::string& vstrXml,
+    void TakeAll(const std::string& vstrPicType, std::int32_t vlngHwnd, CXmlForm& form,
                  const std::string& vstrPicsFolder);
     void TakeForm(const Request& request, CXmlForm& form);
     void TakeControl(const Request& request, CXmlControl& control, const std::string& parentPath);

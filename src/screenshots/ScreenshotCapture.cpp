@@ -73,16 +73,23 @@ struct Screenshot::Request {
 ResultCode Screenshot::LocateObjectsAndTakeScreenshots(const std::string& vstrPicType, std::int32_t vlngHwnd,
                                                        const std::string& vstrXml,
                                                        const std::string& vstrPicsFolder) {
-    return Guarded("LocateObjectsAndTakeScreenshots",
-                   [&] { TakeAll(vstrPicType, vlngHwnd, vstrXml, vstrPicsFolder); });
+    return Guarded("LocateObjectsAndTakeScreenshots", [&] {
+        CXmlForm form;
+        if (const auto code = form.LoadXml(vstrXml); code != kSuccess)
+            throw RaisedError(code, "Error parsing XML form string",
+                              "Screenshot.LocateObjectsAndTakeScreenshots");
+        TakeAll(vstrPicType, vlngHwnd, form, vstrPicsFolder);
+    });
 }
 
-void Screenshot::TakeAll(const std::string& vstrPicType, std::int32_t vlngHwnd, const std::string& vstrXml,
+ResultCode Screenshot::LocateObjectsAndTakeScreenshots(const std::string& vstrPicType, std::int32_t vlngHwnd,
+                                                       CXmlForm& form, const std::string& vstrPicsFolder) {
+    return Guarded("LocateObjectsAndTakeScreenshots",
+                   [&] { TakeAll(vstrPicType, vlngHwnd, form, vstrPicsFolder); });
+}
+
+void Screenshot::TakeAll(const std::string& vstrPicType, std::int32_t vlngHwnd, CXmlForm& form,
                          const std::string& vstrPicsFolder) {
-    CXmlForm form;
-    if (const auto code = form.LoadXml(vstrXml); code != kSuccess)
-        throw RaisedError(code, "Error parsing XML form string",
-                          "Screenshot.LocateObjectsAndTakeScreenshots");
     const auto type = ObjectTypeOf(form);
     auto& agent = Agent();
     const auto window = agent.ActivateComponent(type, form.Name, /*forceOpenInDesignView=*/false,

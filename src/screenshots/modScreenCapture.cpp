@@ -73,10 +73,10 @@ Picture CaptureWindow(platform::WindowHandle hWndSrc, bool Client, int LeftSrc, 
     Trapped(kModule, "CaptureWindow", [&] {
         auto bitmap =
             platform::Env().windows->Capture(hWndSrc, Client, LeftSrc, TopSrc, WidthSrc, HeightSrc, Scale());
-        const bool captured = !bitmap.Empty();
+        const bool captured = bitmap != nullptr && !bitmap->Empty();
         // A window that is gone still yields a picture of its size.
         if (!captured && WidthSrc > 0 && HeightSrc > 0)
-            bitmap = platform::BlackBitmap(WidthSrc, HeightSrc);
+            bitmap = std::make_shared<const platform::Bitmap>(platform::BlackBitmap(WidthSrc, HeightSrc));
         TraceCapture(hWndSrc, captured);
         result = CreateBitmapPicture(std::move(bitmap));
         Line([&] { return "CaptureWindow(12), objPic is nothing " + Yes(result == nullptr); });
@@ -84,10 +84,10 @@ Picture CaptureWindow(platform::WindowHandle hWndSrc, bool Client, int LeftSrc, 
     return result;
 }
 
-Picture CreateBitmapPicture(platform::Bitmap hBmp) {
+Picture CreateBitmapPicture(Picture hBmp) {
     Picture result;
-    if (!hBmp.Empty())
-        result = std::make_shared<const platform::Bitmap>(std::move(hBmp));
+    if (hBmp != nullptr && !hBmp->Empty())
+        result = std::move(hBmp);
     Line([&] { return "CreateBitmapPicture(1), lngRet = " + std::string(result ? "0" : "-1"); });
     return result;
 }

@@ -21,7 +21,8 @@ inline constexpr const char* kJpg = "jpg";
 /// included. Parts outside the window, and a window that is gone, are black.
 Picture CaptureWindow(platform::WindowHandle hWndSrc, bool Client, int LeftSrc, int TopSrc, int WidthSrc,
                       int HeightSrc);
-Picture CreateBitmapPicture(platform::Bitmap hBmp);
+/// Null for an empty bitmap.
+Picture CreateBitmapPicture(Picture hBmp);
 /// The whole window.
 Picture CaptureWindowByHWND(platform::WindowHandle hWnd);
 /// `PicType` "bmp" or "jpg" (at quality 100), without regard to case. An empty path does nothing.

@@ -2,6 +2,8 @@
 
 #include "platform/text/Text.h"
 
+#include <algorithm>
+
 namespace tovimar {
 
 namespace {
@@ -41,12 +43,16 @@ std::size_t FindAscii(std::string_view text, std::string_view needle, std::size_
     // makes a pass over a page cheap.
     const char first = needle.front();
     const bool hasCase = Lower(first) != Upper(first);
-    const char both[2] = {Lower(first), Upper(first)};
+    std::size_t lower = text.find(Lower(first), from);
+    std::size_t upper = hasCase ? text.find(Upper(first), from) : std::string_view::npos;
     while (true) {
-        from = hasCase ? text.find_first_of(std::string_view(both, 2), from) : text.find(first, from);
+        from = std::min(lower, upper);
         if (from == std::string_view::npos || MatchesAt(text, needle, from))
             return from;
-        ++from;
+        if (from == lower)
+            lower = text.find(Lower(first), from + 1);
+        else
+            upper = text.find(Upper(first), from + 1);
     }
 }
 

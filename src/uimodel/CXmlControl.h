@@ -137,7 +137,7 @@ public:
 
 private:
     void ReadAttributes(const XmlNode& node, CAddInProject* project);
-    void ReadGeometry(const XmlNode& node);
+    void ReadGeometry(const XmlAttributes& attributes);
     void AppendAttributes(std::string& out);
     void AppendChildren(std::string& out, const std::string& indent);
     std::string HotSpotText() const;

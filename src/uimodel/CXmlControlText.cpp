@@ -53,41 +53,42 @@ ResultCode CXmlControl::ParseNode(const XmlNode& node, CAddInProject* robjAddInP
 void CXmlControl::ReadAttributes(const XmlNode& node, CAddInProject* project) {
     elementName_ = node.baseName();
     controlType_ = elementName_;
-    Name = node.attribute("Name");
-    bookmarkName_ = node.attribute("BookmarkName");
-    Description = node.attribute("Description");
-    HostCaption = node.attribute("Caption");
-    SetText(TextOr(node, "Text", "Caption"));
-    className_ = node.attribute("ClassName");
-    OriginalClassName = node.attribute("OriginalClassName");
-    PicFullPath = ReadPicturePath(node, project);
-    HelpContextId = Integer(node, "HelpContextId");
-    ReadGeometry(node);
-    Level = Integer(node, "Level");
-    TabIndex = Integer(node, "TabIndex");
+    const XmlAttributes attributes(node);
+    Name = attributes.attribute("Name");
+    bookmarkName_ = attributes.attribute("BookmarkName");
+    Description = attributes.attribute("Description");
+    HostCaption = attributes.attribute("Caption");
+    SetText(TextOr(attributes, "Text", "Caption"));
+    className_ = attributes.attribute("ClassName");
+    OriginalClassName = attributes.attribute("OriginalClassName");
+    PicFullPath = ReadPicturePath(attributes, project);
+    HelpContextId = Integer(attributes, "HelpContextId");
+    ReadGeometry(attributes);
+    Level = Integer(attributes, "Level");
+    TabIndex = Integer(attributes, "TabIndex");
     if (Name.empty())
         Name = Value(platform::Env().clock->Timer()).AsString() + "_" + std::to_string(TabIndex);
-    Visible = Boolean(node, "Visible", Visible);
-    Index = Integer(node, "Index", Index);
-    TabPageIndex = Integer(node, "TabPageIndex", -1);
-    ControlSectionName = node.attribute("SectionName");
-    ParentControlName = node.attribute("ParentControlName");
+    Visible = Boolean(attributes, "Visible", Visible);
+    Index = Integer(attributes, "Index", Index);
+    TabPageIndex = Integer(attributes, "TabPageIndex", -1);
+    ControlSectionName = attributes.attribute("SectionName");
+    ParentControlName = attributes.attribute("ParentControlName");
     if (!text::EqualsIgnoringCase(controlType_, "Label")) {
-        Indexes = node.attribute("Indexes");
+        Indexes = attributes.attribute("Indexes");
         FillIndexes();
     }
 }
 
-void CXmlControl::ReadGeometry(const XmlNode& node) {
-    if (const auto size = Numbers(node, "Size", 2); !size.empty()) {
+void CXmlControl::ReadGeometry(const XmlAttributes& attributes) {
+    if (const auto size = Numbers(attributes, "Size", 2); !size.empty()) {
         Width = size[0];
         Height = size[1];
     }
-    if (const auto location = Numbers(node, "Location", 2); !location.empty()) {
+    if (const auto location = Numbers(attributes, "Location", 2); !location.empty()) {
         Left = location[0];
         Top = location[1];
     }
-    if (const auto tab = Numbers(node, "TabPageTab", 4); !tab.empty()) {
+    if (const auto tab = Numbers(attributes, "TabPageTab", 4); !tab.empty()) {
         TabLeft = tab[0];
         TabTop = tab[1];
         TabWidth = tab[2];

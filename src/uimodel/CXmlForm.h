@@ -158,8 +158,8 @@ private:
     ResultCode Render(const char* operation, const Rendering& rendering);
     std::string RenderText(const Rendering& rendering);
     ResultCode TakeReport(const XmlDocument& document);
-    void ReadRoot(const XmlNode& root, CAddInProject* project);
-    void ReadSizes(const XmlNode& root);
+    void ReadRoot(const XmlAttributes& root, CAddInProject* project);
+    void ReadSizes(const XmlAttributes& root);
     ResultCode ReadChildren(const XmlNode& root, CAddInProject* project);
     ResultCode ReadDocumented(const XmlNode& root);
     ResultCode ReadItems(const XmlNode& documented, const char* listName, DefList& list);

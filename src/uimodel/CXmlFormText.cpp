@@ -142,13 +142,13 @@ ResultCode CXmlForm::ParseNode(const XmlNode& root, CAddInProject* robjAddInProj
         ClassName = kind->element;
         SourceObjectType = kind->objectType;
         ControlsChanged();
-        ReadRoot(root, robjAddInProject);
+        ReadRoot(XmlAttributes(root), robjAddInProject);
         ofChild = ReadChildren(root, robjAddInProject);
     });
     return failure != kSuccess ? failure : ofChild;
 }
 
-void CXmlForm::ReadRoot(const XmlNode& root, CAddInProject* project) {
+void CXmlForm::ReadRoot(const XmlAttributes& root, CAddInProject* project) {
     Name = root.attribute("Name");
     Text = TextOr(root, "Text", "Caption");
     picFullPath_ = ReadPicturePath(root, project);
@@ -173,7 +173,7 @@ void CXmlForm::ReadRoot(const XmlNode& root, CAddInProject* project) {
     FillIndexes();
 }
 
-void CXmlForm::ReadSizes(const XmlNode& root) {
+void CXmlForm::ReadSizes(const XmlAttributes& root) {
     if (const auto size = Numbers(root, "WindowSize", 2); !size.empty()) {
         Width = size[0];
         Height = size[1];

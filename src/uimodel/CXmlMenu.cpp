@@ -55,9 +55,10 @@ ResultCode CXmlMenu::Parse(const std::string& xmlText) {
 
 ResultCode CXmlMenu::ParseNode(const XmlNode& node) {
     return Trapped("CXmlMenu", "Parse", [&] {
-        Name = node.attribute("Name");
-        Text = TextOr(node, "Text", "Caption");
-        Indexes = node.attribute("Indexes");
+        const XmlAttributes attributes(node);
+        Name = attributes.attribute("Name");
+        Text = TextOr(attributes, "Text", "Caption");
+        Indexes = attributes.attribute("Indexes");
         FillIndexes(*this);
     });
 }

@@ -34,14 +34,15 @@ ResultCode CXmlSection::Parse(const std::string& xmlText) {
 
 ResultCode CXmlSection::ParseNode(const XmlNode& node) {
     return Trapped("CXmlSection", "Parse", [&] {
-        Name = node.attribute("Name");
-        Height = Integer(node, "Height");
-        FormRecordSelectorWidth = Integer(node, "FormRecordSelectorWidth");
-        if (const auto offset = Numbers(node, "ClientAreaOffset", 2); !offset.empty()) {
+        const XmlAttributes attributes(node);
+        Name = attributes.attribute("Name");
+        Height = Integer(attributes, "Height");
+        FormRecordSelectorWidth = Integer(attributes, "FormRecordSelectorWidth");
+        if (const auto offset = Numbers(attributes, "ClientAreaOffset", 2); !offset.empty()) {
             ClientAreaOffsetX = offset[0];
             ClientAreaOffsetY = offset[1];
         }
-        DesignTimeHeaderHeight = Integer(node, "DesignTimeHeaderHeight");
+        DesignTimeHeaderHeight = Integer(attributes, "DesignTimeHeaderHeight");
     });
 }
 

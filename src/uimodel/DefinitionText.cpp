@@ -7,6 +7,7 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <charconv>
 
 namespace tovimar::definition {
 
@@ -16,7 +17,13 @@ namespace {
 constexpr std::int32_t kDeepestLevel = 600;
 constexpr std::size_t kKeywordCharacters = 32;
 
-std::int32_t ToInteger(const std::string& number) {
+std::int32_t ToInteger(std::string_view number) {
+    number.remove_prefix(std::min(number.find_first_not_of(' '), number.size()));
+    std::int32_t whole = 0;
+    const auto [end, error] = std::from_chars(number.data(), number.data() + number.size(), whole);
+    if (error == std::errc() && end == number.data() + number.size())
+        return whole;
+    // Whatever else the host takes for a number, or its error.
     return Value(text::Trim(number)).AsInteger();
 }
 
@@ -64,32 +71,35 @@ std::string Indent(std::int32_t level) {
     return std::string(static_cast<std::size_t>(std::clamp(level, 0, kDeepestLevel)) * 2, ' ');
 }
 
-std::int32_t Integer(const XmlNode& node, std::string_view name, std::int32_t absent) {
-    const std::string value = node.attribute(name);
+std::int32_t Integer(const XmlAttributes& node, std::string_view name, std::int32_t absent) {
+    const std::string_view value = node.value(name);
     return value.empty() ? absent : ToInteger(value);
 }
 
-bool Boolean(const XmlNode& node, std::string_view name, bool absent) {
-    const std::string value = node.attribute(name);
+bool Boolean(const XmlAttributes& node, std::string_view name, bool absent) {
+    const std::string_view value = node.value(name);
     return value.empty() ? absent : Value(text::Trim(value)).AsBoolean();
 }
 
-std::vector<std::int32_t> Numbers(const XmlNode& node, std::string_view name, std::size_t count) {
-    const std::string value = node.attribute(name);
+std::vector<std::int32_t> Numbers(const XmlAttributes& node, std::string_view name, std::size_t count) {
+    std::string_view value = node.value(name);
     std::vector<std::int32_t> numbers;
     if (value.empty())
         return numbers;
-    const auto parts = text::Split(value, ",");
-    if (parts.size() < count)
+    if (static_cast<std::size_t>(std::count(value.begin(), value.end(), ',')) + 1 < count)
         throw RaisedError(9, "Subscript out of range", std::string(name));
-    for (std::size_t i = 0; i < count; ++i)
-        numbers.push_back(ToInteger(parts[i]));
+    numbers.reserve(count);
+    while (numbers.size() < count) {
+        const std::size_t comma = std::min(value.find(','), value.size());
+        numbers.push_back(ToInteger(value.substr(0, comma)));
+        value.remove_prefix(std::min(comma + 1, value.size()));
+    }
     return numbers;
 }
 
-std::string TextOr(const XmlNode& node, std::string_view name, std::string_view fallback) {
-    std::string value = node.attribute(name);
-    return value.empty() ? node.attribute(fallback) : value;
+std::string TextOr(const XmlAttributes& node, std::string_view name, std::string_view fallback) {
+    const std::string_view value = node.value(name);
+    return std::string(value.empty() ? node.value(fallback) : value);
 }
 
 std::vector<XmlNode> ChildrenIn(const XmlNode& node, std::string_view name) {

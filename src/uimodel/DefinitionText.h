@@ -27,13 +27,13 @@ void AppendPair(std::string& out, std::string_view opening, std::int32_t first, 
 std::string Indent(std::int32_t level);
 
 /// Numbers of an attribute. An absent or empty one gives `absent`; other text raises error 13.
-std::int32_t Integer(const XmlNode& node, std::string_view name, std::int32_t absent = 0);
-bool Boolean(const XmlNode& node, std::string_view name, bool absent);
+std::int32_t Integer(const XmlAttributes& node, std::string_view name, std::int32_t absent = 0);
+bool Boolean(const XmlAttributes& node, std::string_view name, bool absent);
 /// Parts of an attribute between commas, as numbers; none when it is absent or empty. Raises error 9 when
 /// there are fewer than `count`.
-std::vector<std::int32_t> Numbers(const XmlNode& node, std::string_view name, std::size_t count);
+std::vector<std::int32_t> Numbers(const XmlAttributes& node, std::string_view name, std::size_t count);
 /// The element's text attribute, or the fallback's where it is empty.
-std::string TextOr(const XmlNode& node, std::string_view name, std::string_view fallback);
+std::string TextOr(const XmlAttributes& node, std::string_view name, std::string_view fallback);
 /// The elements in the child of that name; none without it.
 std::vector<XmlNode> ChildrenIn(const XmlNode& node, std::string_view name);
 

@@ -24,11 +24,7 @@ T Converted(const HostObject& object, const char* name, T absent, Convert conver
 Value Read(const HostObject& object, const char* name, const AutomationObject::Arguments& arguments) {
     if (object == nullptr)
         return {};
-    try {
-        return object->Get(name, arguments);
-    } catch (const RaisedError&) {
-        return {};
-    }
+    return object->Find(name, arguments).value_or(Value());
 }
 
 bool Readable(const HostObject& object, const char* name) {

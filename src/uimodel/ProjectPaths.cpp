@@ -10,8 +10,8 @@ namespace tovimar {
 
 namespace {
 
-std::string ReadPath(const XmlNode& node, const char* fullPath, const char* fileName, ProjectFolder folder,
-                     CAddInProject* project) {
+std::string ReadPath(const XmlAttributes& node, const char* fullPath, const char* fileName,
+                     ProjectFolder folder, CAddInProject* project) {
     std::string path = node.attribute(fullPath);
     if (!path.empty())
         return path;
@@ -42,11 +42,11 @@ std::string LocalPicturePath(const std::string& picFullPath) {
     return folder + platform::FileNameOf(picFullPath);
 }
 
-std::string ReadPicturePath(const XmlNode& node, CAddInProject* project) {
+std::string ReadPicturePath(const XmlAttributes& node, CAddInProject* project) {
     return ReadPath(node, "PicFullPath", "PicFileName", ProjectFolder::Pictures, project);
 }
 
-std::string ReadTopicPath(const XmlNode& node, CAddInProject* project) {
+std::string ReadTopicPath(const XmlAttributes& node, CAddInProject* project) {
     return ReadPath(node, "HtmlFullPath", "HtmlFileName", ProjectFolder::Help, project);
 }
 

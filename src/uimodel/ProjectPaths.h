@@ -6,6 +6,7 @@
 namespace tovimar {
 
 class CAddInProject;
+class XmlAttributes;
 class XmlNode;
 
 /// Where the files that a definition names lie. Definitions keep file names; the project at hand, or else
@@ -19,8 +20,8 @@ std::string CompletedPath(const std::string& stored);
 /// Path relative to a topic: the images folder's name and the file's.
 std::string LocalPicturePath(const std::string& picFullPath);
 /// `PicFullPath` of an element, else `PicFileName` in the project's folder of pictures.
-std::string ReadPicturePath(const XmlNode& node, CAddInProject* project);
+std::string ReadPicturePath(const XmlAttributes& node, CAddInProject* project);
 /// `HtmlFullPath` of an element, else `HtmlFileName` in the project's folder.
-std::string ReadTopicPath(const XmlNode& node, CAddInProject* project);
+std::string ReadTopicPath(const XmlAttributes& node, CAddInProject* project);
 
 } // namespace tovimar

@@ -78,12 +78,7 @@ const CN_IDEAccFormProcessor::FormFacts& CN_IDEAccFormProcessor::FactsOf(const H
 }
 
 bool CN_IDEAccFormProcessor::HasProperty(const HostObject& robjComp, const std::string& vstrPropertyName) {
-    try {
-        late::Property(robjComp, vstrPropertyName);
-        return true;
-    } catch (const RaisedError&) {
-        return false;
-    }
+    return robjComp && robjComp->FindProperty(vstrPropertyName).has_value();
 }
 
 Value CN_IDEAccFormProcessor::PropertyValue(const HostObject& robjComp, const std::string& vstrPropertyName) {
@@ -203,7 +198,10 @@ void CN_IDEAccFormProcessor::GetControlIndexes(const HostObject& rctl, std::int3
                                                std::int32_t& rlngIndex) {
     rlngTabIndex = -1;
     rlngIndex = -1;
-    PassOver([&] { rlngTabIndex = late::Property(rctl, "TabIndex").AsInteger(); });
+    PassOver([&] {
+        if (const auto value = rctl->FindProperty("TabIndex"))
+            rlngTabIndex = value->AsInteger();
+    });
 }
 
 std::string CN_IDEAccFormProcessor::GetLabelControlParentName(const HostObject& rctl) {

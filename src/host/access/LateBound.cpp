@@ -11,9 +11,15 @@ AutomationObject& Needed(const HostObject& object, std::string_view member) {
     return *object;
 }
 
-template <typename Result, typename Read> Result OrEmpty(Read read) {
+/// What `convert` makes of the member, else what stands for nothing.
+template <typename Result, typename Convert>
+Result OrEmpty(const HostObject& object, std::string_view member, Convert convert,
+               const AutomationObject::Arguments& arguments = {}) {
+    const auto value = object ? object->Find(member, arguments) : std::nullopt;
+    if (!value)
+        return Result();
     try {
-        return read();
+        return convert(*value);
     } catch (const RaisedError&) {
         return Result();
     }
@@ -61,24 +67,25 @@ Value Property(const HostObject& object, const std::string& name) {
 }
 
 Value PropertyOrNull(const HostObject& object, const std::string& name) {
-    return OrEmpty<Value>([&] { return Property(object, name); });
+    return object ? object->FindProperty(name).value_or(Value()) : Value();
 }
 
 std::int32_t IntegerOrZero(const HostObject& object, std::string_view member) {
-    return OrEmpty<std::int32_t>([&] { return Integer(object, member); });
+    return OrEmpty<std::int32_t>(object, member, [](const Value& value) { return value.AsInteger(); });
 }
 
 bool FlagOrFalse(const HostObject& object, std::string_view member) {
-    return OrEmpty<bool>([&] { return Flag(object, member); });
+    return OrEmpty<bool>(object, member, [](const Value& value) { return value.AsBoolean(); });
 }
 
 std::string TextOrEmpty(const HostObject& object, std::string_view member) {
-    return OrEmpty<std::string>([&] { return Text(object, member); });
+    return OrEmpty<std::string>(object, member, [](const Value& value) { return value.AsString(); });
 }
 
 HostObject ObjectOrNull(const HostObject& object, std::string_view member,
                         const AutomationObject::Arguments& arguments) {
-    return OrEmpty<HostObject>([&] { return Object(object, member, arguments); });
+    return OrEmpty<HostObject>(
+        object, member, [](const Value& value) { return value.AsObject(); }, arguments);
 }
 
 std::string ClassName(const HostObject& object) {

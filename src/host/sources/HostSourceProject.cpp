@@ -115,7 +115,7 @@ std::string HostSourceProject::ReadTextCopy(CTovimarServerAgent& agent, const Pa
                                             const std::string& name, Uses& uses) const {
     platform::FileSystem& files = *platform::Env().files;
     const std::string path =
-        TemporaryFolder() + pass.filePrefix + stamp_ + "_" + std::to_string(position_) + ".txt";
+        PassingFolder() + pass.filePrefix + stamp_ + "_" + std::to_string(position_) + ".txt";
     agent.SaveAsText(pass.objectType, name, path);
     if (!files.FileExists(path))
         return {};

@@ -60,15 +60,12 @@ std::shared_ptr<WindowObject> ControlObject::Window() const {
     return window;
 }
 
-Value ControlObject::ReadOther(std::string_view name, const Arguments&) {
+std::optional<Value> ControlObject::FindOther(std::string_view name, const Arguments&) {
     const auto session = Window()->Session();
     const auto& written = session->Model().WrittenValues(design_);
     if (const auto found = written.find(text::FoldCase(name)); found != written.end())
         return found->second;
-    auto value = EffectiveValue(*design_, name);
-    if (!value)
-        RaiseNoSuchMember(ClassName());
-    return std::move(*value);
+    return EffectiveValue(*design_, name);
 }
 
 void ControlObject::WriteOther(std::string_view name, const Value& value) {
@@ -207,6 +204,11 @@ Value ControlObject::ReadColumnOrder(const Arguments&) {
     if (window->Opened().view != View::Datasheet || !EffectiveValue(*design_, "ColumnOrder"))
         return ReadOther("ColumnOrder", {});
     return window->DatasheetPosition(*design_);
+}
+
+std::optional<Value> ControlObject::FindProperty(const std::string& name) {
+    auto value = Find(name);
+    return value && value->IsObject() ? std::nullopt : value;
 }
 
 Value ControlObject::ReadProperties(const Arguments& arguments) {

@@ -20,13 +20,15 @@ public:
     std::string ClassName() const override;
     static const MemberTable<ControlObject>& Members();
 
+    std::optional<Value> FindProperty(const std::string& name) override;
+
     const DesignObject& DesignOf() const { return *design_; }
     std::shared_ptr<WindowObject> Window() const;
     /// The subform's own form; raises 2467 when there is none.
     std::shared_ptr<WindowObject> NestedWindow(ObjectKind kind);
 
 protected:
-    Value ReadOther(std::string_view name, const Arguments& arguments) override;
+    std::optional<Value> FindOther(std::string_view name, const Arguments& arguments) override;
     void WriteOther(std::string_view name, const Value& value) override;
 
 private:

@@ -4,7 +4,10 @@
 #include "platform/Error.h"
 #include "platform/text/Text.h"
 
+#include <algorithm>
+#include <cstddef>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -33,23 +36,42 @@ template <class T> struct Member {
     void (T::*write)(const Value&) = nullptr;
 };
 
+/// Members have ASCII names; looking one up, which a capture does dozens of times per control, makes no
+/// text of its own.
+struct AsciiCaselessHash {
+    static char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + 32) : c; }
+    std::size_t operator()(std::string_view name) const {
+        std::size_t hash = 14695981039346656037ULL; // FNV-1a
+        for (const char c : name)
+            hash = (hash ^ static_cast<unsigned char>(Lower(c))) * 1099511628211ULL;
+        return hash;
+    }
+};
+struct AsciiCaselessEqual {
+    bool operator()(std::string_view left, std::string_view right) const {
+        return std::equal(left.begin(), left.end(), right.begin(), right.end(), [](char a, char b) {
+            return AsciiCaselessHash::Lower(a) == AsciiCaselessHash::Lower(b);
+        });
+    }
+};
+
 template <class T> class MemberTable {
 public:
     MemberTable(std::initializer_list<Member<T>> members) {
         for (const auto& member : members)
-            members_.emplace(text::FoldCase(member.name), member);
+            members_.emplace(member.name, member);
     }
     const Member<T>* Find(std::string_view name) const {
-        const auto found = members_.find(text::FoldCase(name));
+        const auto found = members_.find(name);
         return found == members_.end() ? nullptr : &found->second;
     }
 
 private:
-    std::unordered_map<std::string, Member<T>> members_;
+    std::unordered_map<std::string_view, Member<T>, AsciiCaselessHash, AsciiCaselessEqual> members_;
 };
 
 /// T gives its table as `static const MemberTable<T>& Members()`. Names outside of the table go to
-/// `ReadOther` and `WriteOther`, which raise 438 unless T has more to say.
+/// `FindOther` and `WriteOther`; reading one that isn't found raises 438.
 template <class T> class LateBound : public AutomationObject {
 public:
     Value Get(std::string_view name, const Arguments& arguments = {}) override {
@@ -57,6 +79,16 @@ public:
         if (!member || !member->read)
             return ReadOther(name, arguments);
         return (static_cast<T*>(this)->*member->read)(arguments);
+    }
+    std::optional<Value> Find(std::string_view name, const Arguments& arguments = {}) override {
+        const auto* member = T::Members().Find(name);
+        if (member && member->read)
+            return AutomationObject::Find(name, arguments);
+        try {
+            return FindOther(name, arguments);
+        } catch (const RaisedError&) {
+            return std::nullopt; // a closed object
+        }
     }
     void Set(std::string_view name, const Value& value) override {
         const auto* member = T::Members().Find(name);
@@ -70,7 +102,13 @@ public:
     }
 
 protected:
-    virtual Value ReadOther(std::string_view, const Arguments&) { RaiseNoSuchMember(ClassName()); }
+    Value ReadOther(std::string_view name, const Arguments& arguments) {
+        auto value = FindOther(name, arguments);
+        if (!value)
+            RaiseNoSuchMember(ClassName());
+        return std::move(*value);
+    }
+    virtual std::optional<Value> FindOther(std::string_view, const Arguments&) { return std::nullopt; }
     virtual void WriteOther(std::string_view, const Value&) { RaiseNoSuchMember(ClassName()); }
 };
 

@@ -31,11 +31,8 @@ std::pair<int, int> SectionObject::PrintedPlace() {
     return *place;
 }
 
-Value SectionObject::ReadOther(std::string_view name, const Arguments&) {
-    auto value = EffectiveValue(*design_, name);
-    if (!value)
-        RaiseNoSuchMember(ClassName());
-    return std::move(*value);
+std::optional<Value> SectionObject::FindOther(std::string_view name, const Arguments&) {
+    return EffectiveValue(*design_, name);
 }
 
 Value SectionObject::ReadProperties(const Arguments& arguments) {

@@ -20,7 +20,7 @@ public:
     static const MemberTable<SectionObject>& Members();
 
 protected:
-    Value ReadOther(std::string_view name, const Arguments& arguments) override;
+    std::optional<Value> FindOther(std::string_view name, const Arguments& arguments) override;
 
 private:
     Value ReadHeight(const Arguments&);

@@ -187,16 +187,13 @@ const std::pair<int, int>* WindowObject::PrintedPlace(std::int32_t section) {
     return found == printed_->end() ? nullptr : &found->second;
 }
 
-Value WindowObject::ReadOther(std::string_view name, const Arguments&) {
+std::optional<Value> WindowObject::FindOther(std::string_view name, const Arguments&) {
     CheckOpen();
     const auto session = Session();
     const auto& written = session->Model().WrittenValues(open_.design);
     if (const auto found = written.find(text::FoldCase(name)); found != written.end())
         return found->second;
-    auto value = EffectiveValue(*open_.design->root, name);
-    if (!value)
-        RaiseNoSuchMember(ClassName());
-    return std::move(*value);
+    return EffectiveValue(*open_.design->root, name);
 }
 
 void WindowObject::WriteOther(std::string_view name, const Value& value) {

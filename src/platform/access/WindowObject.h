@@ -52,7 +52,7 @@ public:
     const std::pair<int, int>* PrintedPlace(std::int32_t section);
 
 protected:
-    Value ReadOther(std::string_view name, const Arguments& arguments) override;
+    std::optional<Value> FindOther(std::string_view name, const Arguments& arguments) override;
     void WriteOther(std::string_view name, const Value& value) override;
 
 private:

@@ -14,8 +14,6 @@ namespace {
 
 /// A rectangle of a picture; what lies outside is black.
 Bitmap Cut(const Bitmap& source, int left, int top, int width, int height) {
-    if (left == 0 && top == 0 && width == source.width && height == source.height)
-        return source;
     auto result = BlackBitmap(width, height);
     if (result.Empty())
         return {};
@@ -100,14 +98,14 @@ WindowHandle WindowSystem::FindTopLevel(const std::string& className, const std:
     return 0;
 }
 
-Bitmap WindowSystem::Capture(WindowHandle handle, bool client, int left, int top, int width, int height,
-                             double scale) {
+std::shared_ptr<const Bitmap> WindowSystem::Capture(WindowHandle handle, bool client, int left, int top,
+                                                    int width, int height, double scale) {
     Window* window = Find(handle);
     if (window == nullptr)
-        return {};
+        return nullptr;
     scale = FittingScale(window->rectangle, scale);
     if (painted_.handle != handle || painted_.scale != scale) {
-        painted_.bitmap = window->Paint(scale);
+        painted_.bitmap = std::make_shared<const Bitmap>(window->Paint(scale));
         painted_.handle = handle;
         painted_.scale = scale;
     }
@@ -116,15 +114,18 @@ Bitmap WindowSystem::Capture(WindowHandle handle, bool client, int left, int top
         top += window->client.top;
     }
     const auto device = [scale](int value) { return static_cast<int>(std::lround(value * scale)); };
-    return Cut(painted_.bitmap, device(left), device(top), device(left + width) - device(left),
-               device(top + height) - device(top));
+    const Rectangle cut{device(left), device(top), device(left + width), device(top + height)};
+    if (cut == Rectangle{0, 0, painted_.bitmap->width, painted_.bitmap->height})
+        return painted_.bitmap;
+    return std::make_shared<const Bitmap>(
+        Cut(*painted_.bitmap, cut.left, cut.top, cut.Width(), cut.Height()));
 }
 
 void WindowSystem::Invalidate(WindowHandle handle) {
     if (painted_.handle != handle)
         return;
     painted_.handle = 0;
-    painted_.bitmap = {};
+    painted_.bitmap = nullptr;
 }
 
 } // namespace tovimar::platform

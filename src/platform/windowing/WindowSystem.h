@@ -74,12 +74,13 @@ public:
     WindowHandle FindTopLevel(const std::string& className, const std::string& caption);
 
     /// Pixels of the rectangle, in window coordinates, or in client coordinates when `client` is set.
-    /// Parts outside the window are black. An unknown handle gives an empty bitmap. With a `scale` other
+    /// Parts outside the window are black. An unknown handle gives null. With a `scale` other
     /// than 1 every pixel of the window becomes that many of the bitmap each way, painted sharp at that size;
     /// a window that would need more than 48 million pixels is painted at a lower scale, 1 at the least. The
     /// window is painted once and the picture kept until the window changes (`Invalidate`).
-    Bitmap Capture(WindowHandle handle, bool client, int left, int top, int width, int height,
-                   double scale = 1);
+    /// The picture of a whole window isn't copied.
+    std::shared_ptr<const Bitmap> Capture(WindowHandle handle, bool client, int left, int top, int width,
+                                          int height, double scale = 1);
     /// The next capture paints the window anew.
     void Invalidate(WindowHandle handle);
 
@@ -90,7 +91,7 @@ private:
     struct Painted {
         WindowHandle handle = 0;
         double scale = 1;
-        Bitmap bitmap;
+        std::shared_ptr<const Bitmap> bitmap;
     } painted_;
 };
 

@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace pugi {
@@ -69,8 +70,24 @@ public:
 
 private:
     friend class XmlDocument;
+    friend class XmlAttributes;
     explicit XmlNode(pugi::xml_node_struct* node) : node_(node) {}
     pugi::xml_node_struct* node_ = nullptr;
+};
+
+/// The attributes of one element, for readers of many of them: read once, found without a walk over pointers.
+/// Views of the document's own text, good until the document changes or goes.
+class XmlAttributes {
+public:
+    explicit XmlAttributes(const XmlNode& node);
+    /// Exact comparison; `absent` where there is no such attribute.
+    std::string_view value(std::string_view name, std::string_view absent = {}) const;
+    std::string attribute(std::string_view name, std::string_view absent = {}) const {
+        return std::string(value(name, absent));
+    }
+
+private:
+    std::vector<std::pair<std::string_view, std::string_view>> attributes_;
 };
 
 class XmlDocument {

@@ -55,6 +55,20 @@ pugi::xpath_query Compile(std::string_view xpath) {
 
 } // namespace
 
+XmlAttributes::XmlAttributes(const XmlNode& node) {
+    attributes_.reserve(24);
+    for (auto attribute = Wrap(node.node_).first_attribute(); attribute;
+         attribute = attribute.next_attribute())
+        attributes_.emplace_back(attribute.name(), attribute.value());
+}
+
+std::string_view XmlAttributes::value(std::string_view name, std::string_view absent) const {
+    for (const auto& [own, value] : attributes_)
+        if (own == name)
+            return value;
+    return absent;
+}
+
 bool XmlNode::IsElement() const {
     return Wrap(node_).type() == pugi::node_element;
 }

@@ -65,10 +65,10 @@ public:
 
     platform::Bitmap Picture() {
         const auto area = windows.Find(object.window)->rectangle;
-        return windows.Capture(object.window, false, 0, 0, area.Width(), area.Height());
+        return *windows.Capture(object.window, false, 0, 0, area.Width(), area.Height());
     }
     std::uint32_t Pixel(int x, int y) {
-        return windows.Capture(object.window, false, x, y, 1, 1).pixels.at(0);
+        return windows.Capture(object.window, false, x, y, 1, 1)->pixels.at(0);
     }
     /// A control's rectangle within the picture.
     platform::Rectangle PlaceOf(const std::string& controlName) const {

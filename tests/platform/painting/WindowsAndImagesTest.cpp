@@ -41,16 +41,16 @@ TEST(Windows, CapturesCutFromOnePainting) {
     auto made = std::make_unique<CountingWindow>("A");
     auto* window = made.get();
     const auto handle = windows.Open(std::move(made));
-    EXPECT_EQ(windows.Capture(handle, false, 0, 0, 2, 2).pixels, FourPixels().pixels);
-    EXPECT_EQ(windows.Capture(handle, true, 0, 0, 1, 1).pixels, Pixels{0xFFFFFF});
-    EXPECT_EQ(windows.Capture(handle, false, 1, -1, 2, 2).pixels, (Pixels{0, 0, 0x00FF00, 0}))
+    EXPECT_EQ(windows.Capture(handle, false, 0, 0, 2, 2)->pixels, FourPixels().pixels);
+    EXPECT_EQ(windows.Capture(handle, true, 0, 0, 1, 1)->pixels, Pixels{0xFFFFFF});
+    EXPECT_EQ(windows.Capture(handle, false, 1, -1, 2, 2)->pixels, (Pixels{0, 0, 0x00FF00, 0}))
         << "black outside";
     EXPECT_EQ(window->painted, 1);
     windows.Invalidate(handle);
     windows.Capture(handle, false, 0, 0, 1, 1);
     EXPECT_EQ(window->painted, 2);
-    EXPECT_TRUE(windows.Capture(handle, false, 0, 0, 0, 5).Empty());
-    EXPECT_TRUE(windows.Capture(999, false, 0, 0, 5, 5).Empty());
+    EXPECT_TRUE(windows.Capture(handle, false, 0, 0, 0, 5)->Empty());
+    EXPECT_EQ(windows.Capture(999, false, 0, 0, 5, 5), nullptr);
 }
 
 TEST(Windows, ALargerScaleMultipliesEveryPixelAndKeepsItsPlace) {
@@ -97,7 +97,7 @@ End
     const auto area = window.windows.Find(window.object.window)->rectangle;
     const auto plain = window.Picture();
     const auto at = [&](double scale) {
-        return window.windows.Capture(window.object.window, false, 0, 0, area.Width(), area.Height(), scale);
+        return *window.windows.Capture(window.object.window, false, 0, 0, area.Width(), area.Height(), scale);
     };
     const auto twice = at(2);
     ASSERT_EQ(twice.width, 2 * plain.width);
@@ -110,7 +110,7 @@ End
     EXPECT_EQ(different, 0U);
 
     EXPECT_EQ(at(1.5).width, std::lround(area.Width() * 1.5));
-    const auto cut = window.windows.Capture(window.object.window, false, 11, 12, 9, 7, 2);
+    const auto cut = *window.windows.Capture(window.object.window, false, 11, 12, 9, 7, 2);
     EXPECT_EQ(cut.width, 18);
     EXPECT_EQ(cut.height, 14);
     EXPECT_EQ(cut.pixels.at(0), plain.pixels[static_cast<std::size_t>(12 * plain.width + 11)]);
