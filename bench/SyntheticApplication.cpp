@@ -21,7 +21,7 @@ std::string Place(int left, int top, int width, int height) {
 }
 
 /// A text or combo box with its attached label, as the host nests them.
-std::string LabelledBox(int index, const std::string& kind = "TextBox") {
+std::string LabelledBox(int index, const std::string& kind = "TextBox", const std::string& suffix = {}) {
     const int top = 120 + index / 2 * 420;
     const int left = index % 2 * 5400 + 120;
     const std::string number = std::to_string(index);
@@ -31,7 +31,7 @@ std::string LabelledBox(int index, const std::string& kind = "TextBox") {
            "\"\r\n                    StatusBarText =\"What field " + number +
            " is for\"\r\n                    Begin\r\n                        Begin Label\r\n" +
            Place(left, top, 1700, 300) + "                            Name =\"lblField" + number +
-           "\"\r\n                            Caption =\"Field &" + number +
+           "\"\r\n                            Caption =\"Field &" + number + suffix +
            ":\"\r\n                        End\r\n                    End\r\n                End\r\n";
 }
 
@@ -68,7 +68,7 @@ std::string LargeForm(int number) {
     constexpr int kBoxes = 45;
     std::string text = DesignStart("Form", number, 11000);
     for (int i = 0; i < kBoxes; ++i)
-        text += LabelledBox(i, i % 15 == 14 ? "ComboBox" : "TextBox");
+        text += LabelledBox(i, i % 15 == 14 ? "ComboBox" : "TextBox", " of " + std::to_string(number));
     for (int i = 0; i < 4; ++i)
         text += Simple("CheckBox", i, 5520 + i * 1200, 9360, 300);
     for (int i = 0; i < 6; ++i)

@@ -5,9 +5,9 @@
 #include "cli/Surroundings.h"
 #include "foundation/ShowMessage.h"
 #include "platform/Interrupt.h"
+#include "platform/Memory.h"
 
 #include <exception>
-#include <malloc.h>
 
 namespace tovimar::cli {
 namespace {
@@ -43,20 +43,8 @@ int Run(const Arguments& arguments) {
 } // namespace
 } // namespace tovimar::cli
 
-namespace {
-
-/// Pictures are megabytes that come and go with each object. Memory that goes back to the system in between
-/// comes back page by page and zeroed, which costs more than painting.
-void KeepFreedMemory() {
-    constexpr int kLargestKept = 32 << 20, kMostKept = 256 << 20;
-    mallopt(M_MMAP_THRESHOLD, kLargestKept);
-    mallopt(M_TRIM_THRESHOLD, kMostKept);
-}
-
-} // namespace
-
 int main(int count, char** arguments) {
-    KeepFreedMemory();
+    tovimar::platform::KeepFreedMemory();
     const auto parsed = tovimar::cli::ParseCommandLine(count, arguments);
     return parsed.ended ? parsed.exitCode : tovimar::cli::Run(parsed);
 }

@@ -61,6 +61,14 @@ public:
 
     /// Values that were written to an object's properties; they last as long as the application.
     std::unordered_map<std::string, Value>& WrittenValues(const void* object) { return written_[object]; }
+    /// Null for a property that wasn't written.
+    const Value* WrittenValue(const void* object, std::string_view name) const {
+        const auto values = written_.find(object);
+        if (values == written_.end())
+            return nullptr;
+        const auto found = values->second.find(text::FoldCase(name));
+        return found == values->second.end() ? nullptr : &found->second;
+    }
 
 private:
     struct Object {

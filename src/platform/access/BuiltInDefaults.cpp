@@ -238,16 +238,15 @@ Groups GroupsOf(std::string& folded) {
 
 /// Defaults of one kind, made at its first look-up.
 const DefaultTable& TableOf(std::string_view type) {
-    static std::unordered_map<std::string, DefaultTable> tables;
-    auto folded = text::FoldCase(type);
-    const auto found = tables.find(folded);
-    if (found != tables.end())
+    static std::unordered_map<std::string, DefaultTable, text::CaselessHash, text::CaselessEqual> tables;
+    if (const auto found = tables.find(type); found != tables.end())
         return found->second;
+    auto folded = text::FoldCase(type);
     const auto groups = GroupsOf(folded);
     auto& table = tables[folded];
     for (const auto& group : groups)
         for (const auto& entry : group)
-            table[text::FoldCase(entry.property)] = {std::string(entry.property), std::string(entry.value)};
+            table[std::string(entry.property)] = {std::string(entry.property), std::string(entry.value)};
     return table;
 }
 
@@ -257,9 +256,9 @@ const DefaultTable& BuiltInDefaults(std::string_view type) {
     return TableOf(type);
 }
 
-std::optional<std::string> BuiltInDefault(std::string_view type, std::string_view property) {
+std::optional<std::string_view> BuiltInDefault(std::string_view type, std::string_view property) {
     const auto& table = TableOf(type);
-    const auto found = table.find(text::FoldCase(property));
+    const auto found = table.find(property);
     if (found == table.end())
         return std::nullopt;
     return found->second.value;

@@ -62,9 +62,8 @@ std::shared_ptr<WindowObject> ControlObject::Window() const {
 
 std::optional<Value> ControlObject::FindOther(std::string_view name, const Arguments&) {
     const auto session = Window()->Session();
-    const auto& written = session->Model().WrittenValues(design_);
-    if (const auto found = written.find(text::FoldCase(name)); found != written.end())
-        return found->second;
+    if (const Value* written = session->Model().WrittenValue(design_, name))
+        return *written;
     return EffectiveValue(*design_, name);
 }
 

@@ -60,8 +60,8 @@ bool DesignObject::Is(std::string_view typeName) const {
 
 const PropertyValue* DesignObject::FindOwn(std::string_view property) const {
     for (; indexed_ < properties.size(); ++indexed_)
-        index_.try_emplace(text::FoldCase(properties[indexed_].first), indexed_);
-    const auto found = index_.find(text::FoldCase(property));
+        index_.try_emplace(properties[indexed_].first, indexed_);
+    const auto found = index_.find(property);
     return found == index_.end() ? nullptr : &properties[found->second].second;
 }
 
@@ -98,7 +98,7 @@ std::string DesignObject::Text(std::string_view property, std::string_view absen
         return Flag(property) ? "True" : "False";
     if (value)
         return value->text;
-    return BuiltInDefault(type, property).value_or(std::string(absent));
+    return std::string(BuiltInDefault(type, property).value_or(absent));
 }
 
 std::vector<SectionRef> Design::Sections() const {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/text/Caseless.h"
+
 #include <cstdint>
 #include <map>
 #include <memory>
@@ -58,13 +60,14 @@ public:
     bool Is(std::string_view typeName) const; ///< ignoring case
 
 private:
-    /// Index of `properties` by folded name, filled at the first look-up.
-    mutable std::unordered_map<std::string, std::size_t> index_;
+    /// Index of `properties` by name, filled at the first look-up.
+    mutable std::unordered_map<std::string, std::size_t, text::CaselessHash, text::CaselessEqual> index_;
     mutable std::size_t indexed_ = 0;
 };
 
 /// The host's default of a property for a kind of object; none when there is none.
-std::optional<std::string> BuiltInDefault(std::string_view type, std::string_view property);
+/// The text lives as long as the program.
+std::optional<std::string_view> BuiltInDefault(std::string_view type, std::string_view property);
 
 /// Sections by the host's numbers: 0 detail, 1 form or report header, 2 its footer, 3 page header,
 /// 4 page footer, 5 and up group headers and footers by turns (level 1 header 5, footer 6, ...).

@@ -46,13 +46,18 @@ constexpr std::array kKinds = {
 };
 
 const Kind* FindKind(std::string_view type) {
-    const auto folded = text::FoldCase(type);
-    const auto found =
-        std::find_if(kKinds.begin(), kKinds.end(), [&](const Kind& kind) { return kind.type == folded; });
-    return found == kKinds.end() ? nullptr : &*found;
+    using Table = std::unordered_map<std::string_view, const Kind*, text::CaselessHash, text::CaselessEqual>;
+    static const Table byType = [] {
+        Table table;
+        for (const Kind& kind : kKinds)
+            table.emplace(kind.type, &kind);
+        return table;
+    }();
+    const auto found = byType.find(type);
+    return found == byType.end() ? nullptr : found->second;
 }
 
-Value NumberValue(const std::string& digits) {
+Value NumberValue(std::string_view digits) {
     const auto* end = digits.data() + digits.size();
     std::int32_t whole = 0;
     if (const auto result = std::from_chars(digits.data(), end, whole);
@@ -62,15 +67,15 @@ Value NumberValue(const std::string& digits) {
     if (const auto result = std::from_chars(digits.data(), end, number);
         result.ec == std::errc() && result.ptr == end)
         return number;
-    return digits;
+    return std::string(digits);
 }
 
-bool IsFlag(const std::optional<std::string>& builtIn) {
+bool IsFlag(const std::optional<std::string_view>& builtIn) {
     return builtIn && (*builtIn == "True" || *builtIn == "False");
 }
 
 std::string_view NameInExport(const DesignObject& object, std::string_view property) {
-    if (ControlTypeNumber(object.type) != 0 && text::EqualsIgnoringCase(property, "BorderStyle"))
+    if (text::EqualsIgnoringCase(property, "BorderStyle") && ControlTypeNumber(object.type) != 0)
         return "OldBorderStyle";
     return property;
 }
@@ -97,18 +102,18 @@ std::optional<Value> EffectiveValue(const DesignObject& object, std::string_view
         return Value(object.Flag(name));
     if (value && value->form != PropertyValue::Form::Number)
         return Value(value->text);
-    const auto& digits = value ? value->text : *builtIn;
-    return digits.empty() ? Value(digits) : NumberValue(digits);
+    const std::string_view digits = value ? std::string_view(value->text) : *builtIn;
+    return digits.empty() ? Value(std::string()) : NumberValue(digits);
 }
 
 std::vector<std::string> PropertyNames(const DesignObject& object) {
     DefaultTable names = BuiltInDefaults(object.type);
     for (const auto* source = &object; source; source = source->prototype)
         for (const auto& [name, value] : source->properties)
-            names.try_emplace(text::FoldCase(name), DefaultEntry{name, {}});
+            names.try_emplace(name, DefaultEntry{name, {}});
     std::vector<std::string> sorted;
     sorted.reserve(names.size());
-    for (const auto& [folded, entry] : names)
+    for (const auto& [key, entry] : names)
         sorted.push_back(entry.name);
     std::sort(sorted.begin(), sorted.end(), [](const std::string& left, const std::string& right) {
         return text::CompareIgnoringCase(left, right) < 0;

@@ -19,7 +19,7 @@ struct DefaultEntry {
     std::string value;
 };
 /// By folded property name; empty for kinds without properties of their own.
-using DefaultTable = std::unordered_map<std::string, DefaultEntry>;
+using DefaultTable = std::unordered_map<std::string, DefaultEntry, text::CaselessHash, text::CaselessEqual>;
 const DefaultTable& BuiltInDefaults(std::string_view type);
 
 /// The host's class name of a control kind: "Tab" is a "TabControl", "Subform" a "SubForm", ...

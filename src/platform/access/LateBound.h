@@ -2,10 +2,9 @@
 
 #include "platform/AutomationObject.h"
 #include "platform/Error.h"
+#include "platform/text/Caseless.h"
 #include "platform/text/Text.h"
 
-#include <algorithm>
-#include <cstddef>
 #include <memory>
 #include <optional>
 #include <string>
@@ -36,25 +35,6 @@ template <class T> struct Member {
     void (T::*write)(const Value&) = nullptr;
 };
 
-/// Members have ASCII names; looking one up, which a capture does dozens of times per control, makes no
-/// text of its own.
-struct AsciiCaselessHash {
-    static char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + 32) : c; }
-    std::size_t operator()(std::string_view name) const {
-        std::size_t hash = 14695981039346656037ULL; // FNV-1a
-        for (const char c : name)
-            hash = (hash ^ static_cast<unsigned char>(Lower(c))) * 1099511628211ULL;
-        return hash;
-    }
-};
-struct AsciiCaselessEqual {
-    bool operator()(std::string_view left, std::string_view right) const {
-        return std::equal(left.begin(), left.end(), right.begin(), right.end(), [](char a, char b) {
-            return AsciiCaselessHash::Lower(a) == AsciiCaselessHash::Lower(b);
-        });
-    }
-};
-
 template <class T> class MemberTable {
 public:
     MemberTable(std::initializer_list<Member<T>> members) {
@@ -67,7 +47,7 @@ public:
     }
 
 private:
-    std::unordered_map<std::string_view, Member<T>, AsciiCaselessHash, AsciiCaselessEqual> members_;
+    std::unordered_map<std::string_view, Member<T>, text::CaselessHash, text::CaselessEqual> members_;
 };
 
 /// T gives its table as `static const MemberTable<T>& Members()`. Names outside of the table go to

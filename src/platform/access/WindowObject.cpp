@@ -190,9 +190,8 @@ const std::pair<int, int>* WindowObject::PrintedPlace(std::int32_t section) {
 std::optional<Value> WindowObject::FindOther(std::string_view name, const Arguments&) {
     CheckOpen();
     const auto session = Session();
-    const auto& written = session->Model().WrittenValues(open_.design);
-    if (const auto found = written.find(text::FoldCase(name)); found != written.end())
-        return found->second;
+    if (const Value* written = session->Model().WrittenValue(open_.design, name))
+        return *written;
     return EffectiveValue(*open_.design->root, name);
 }
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cairo.h>
 #include <cmath>
+#include <cstring>
 #include <numbers>
 
 namespace tovimar::platform::painting {
@@ -64,11 +65,17 @@ void Canvas::FillDevice(const Rectangle& area, Color color) {
     const auto seen = Common(area, deviceClip_);
     if (seen.left >= seen.right)
         return;
-    for (int y = seen.top; y < seen.bottom; ++y) {
-        auto* row =
-            bitmap_.pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(bitmap_.width);
-        std::fill(row + seen.left, row + seen.right, color);
-    }
+    const auto row = [&](int y) {
+        return bitmap_.pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(bitmap_.width) +
+               seen.left;
+    };
+    if (seen.top >= seen.bottom)
+        return;
+    // The first row stays near at hand while it is copied to the others.
+    std::fill_n(row(seen.top), seen.Width(), color);
+    const auto bytes = static_cast<std::size_t>(seen.Width()) * sizeof(std::uint32_t);
+    for (int y = seen.top + 1; y < seen.bottom; ++y)
+        std::memcpy(row(y), row(seen.top), bytes);
 }
 
 void Canvas::Fill(const Rectangle& area, Color color) {

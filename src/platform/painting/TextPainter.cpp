@@ -57,6 +57,11 @@ const char* FamilyFor(const std::string& family) {
     return "Liberation Sans";
 }
 
+std::string KeyOf(const TextStyle& style) {
+    return style.family + '\n' + std::to_string(std::clamp(style.size, kSmallestSize, kLargestSize)) +
+           (style.weight >= 600 ? "b" : "") + (style.italic ? "i" : "");
+}
+
 struct Unref {
     void operator()(void* object) const { g_object_unref(object); }
 };
@@ -65,7 +70,7 @@ struct FreeFont {
 };
 using Font = std::unique_ptr<PangoFontDescription, FreeFont>;
 
-/// One context, one layout and the fonts of the process: making them costs far more than using them.
+/// The context and the fonts of the process: making them costs far more than using them.
 class Fonts {
 public:
     static Fonts& Get() {
@@ -73,12 +78,13 @@ public:
         return fonts;
     }
 
-    PangoLayout* Layout(const TextStyle& style) {
-        const auto* font = Find(style);
-        if (font != current_)
-            pango_layout_set_font_description(layout_.get(), font);
-        current_ = font;
-        return layout_.get();
+    /// A layout of its own in that style, to be set and given back.
+    PangoLayout* MakeLayout(const TextStyle& style) {
+        auto* layout = pango_layout_new(context_.get());
+        pango_layout_set_wrap(layout, PANGO_WRAP_WORD_CHAR);
+        pango_layout_set_auto_dir(layout, TRUE);
+        pango_layout_set_font_description(layout, Find(style));
+        return layout;
     }
 
 private:
@@ -91,24 +97,18 @@ private:
         pango_cairo_context_set_font_options(context_.get(), options);
         cairo_font_options_destroy(options);
         pango_context_set_language(context_.get(), pango_language_from_string("en"));
-        layout_.reset(pango_layout_new(context_.get()));
-        pango_layout_set_wrap(layout_.get(), PANGO_WRAP_WORD_CHAR);
-        pango_layout_set_auto_dir(layout_.get(), TRUE);
     }
 
     const PangoFontDescription* Find(const TextStyle& style) {
         const int size = std::clamp(style.size, kSmallestSize, kLargestSize);
         const bool bold = style.weight >= 600;
-        const auto key =
-            style.family + '\n' + std::to_string(size) + (bold ? "b" : "") + (style.italic ? "i" : "");
+        const auto key = KeyOf(style);
         const auto found = fonts_.find(key);
         if (found != fonts_.end())
             return found->second.get();
         // Sizes and families of a hostile design must not fill the memory.
-        if (fonts_.size() >= 512) {
+        if (fonts_.size() >= 512)
             fonts_.clear();
-            current_ = nullptr;
-        }
         Font font(pango_font_description_new());
         pango_font_description_set_family_static(font.get(), FamilyFor(style.family));
         pango_font_description_set_size(font.get(), size * PANGO_SCALE);
@@ -119,9 +119,7 @@ private:
 
     std::unique_ptr<PangoFontMap, Unref> map_;
     std::unique_ptr<PangoContext, Unref> context_;
-    std::unique_ptr<PangoLayout, Unref> layout_;
     std::unordered_map<std::string, Font> fonts_;
-    const PangoFontDescription* current_ = nullptr;
 };
 
 /// A caption without its marks, and the bytes that are underlined.
@@ -199,36 +197,111 @@ namespace {
 /// too broad, or that would take a line too many, is drawn narrower by up to this factor.
 constexpr double kNarrowest = 0.85;
 
-struct Fitted {
-    int width = 0, height = 0; ///< as laid out
-    double scale = 1;          ///< horizontally
+/// A text broken into lines and glyphs.
+struct LaidText {
+    std::unique_ptr<PangoLayout, Unref> layout;
+    int width = 0, height = 0;
+    double scale = 1; ///< horizontally, to fit where it was laid
 };
 
-Fitted Fit(PangoLayout* layout, const TextPlace& place) {
-    Fitted fitted;
-    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
-    const int room = place.area.Width();
-    if (!place.wrap) {
-        // Each scale has glyphs of its own to be drawn: few steps keep them shared.
-        for (const double scale : {0.95, 0.9, kNarrowest})
-            if (fitted.width > room && fitted.width * scale <= room) {
-                fitted.scale = scale;
-                break;
-            }
-        return fitted;
+void Measure(LaidText& text) {
+    pango_layout_get_pixel_size(text.layout.get(), &text.width, &text.height);
+}
+
+/// Wraps the text to the room, a little narrower when that saves a line.
+void Wrap(LaidText& text, int room, int height) {
+    pango_layout_set_width(text.layout.get(), room * PANGO_SCALE);
+    Measure(text);
+    if (text.height <= height + 1)
+        return;
+    const int plain = text.height;
+    pango_layout_set_width(text.layout.get(), static_cast<int>(room / kNarrowest) * PANGO_SCALE);
+    Measure(text);
+    if (text.height < plain) {
+        text.scale = kNarrowest;
+        return;
     }
-    if (fitted.height <= place.area.Height() + 1)
-        return fitted;
-    const int height = fitted.height;
-    pango_layout_set_width(layout, static_cast<int>(room / kNarrowest) * PANGO_SCALE);
-    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
-    if (fitted.height < height) {
-        fitted.scale = kNarrowest;
-        return fitted;
+    pango_layout_set_width(text.layout.get(), room * PANGO_SCALE);
+    Measure(text);
+}
+
+/// How far a line of that width is narrowed to fit the room.
+double ScaleToFit(int width, int room) {
+    // Each scale has glyphs of its own to be drawn: few steps keep them shared.
+    for (const double scale : {0.95, 0.9, kNarrowest})
+        if (width > room && width * scale <= room)
+            return scale;
+    return 1;
+}
+
+/// Breaking a text into glyphs costs several times what drawing them does, and captions and values come
+/// again: in the rows of a list, on the pages of a tab control, from form to form. The last ones are kept.
+class LaidTexts {
+public:
+    static LaidTexts& Get() {
+        static LaidTexts texts;
+        return texts;
     }
-    pango_layout_set_width(layout, room * PANGO_SCALE);
-    pango_layout_get_pixel_size(layout, &fitted.width, &fitted.height);
-    return fitted;
+
+    /// On one line, at its own size.
+    LaidText& Line(const Caption& caption, const TextStyle& style) {
+        auto [text, fresh] = Find("", caption, style);
+        if (fresh) {
+            pango_layout_set_single_paragraph_mode(text.layout.get(), TRUE);
+            Measure(text);
+        }
+        return text;
+    }
+
+    LaidText& Lines(const Caption& caption, const TextStyle& style, const TextPlace& place) {
+        const int room = place.area.Width(), height = place.area.Height();
+        auto [text, fresh] = Find(std::to_string(room) + ',' + std::to_string(height) + ',' +
+                                      std::to_string(static_cast<int>(place.align)),
+                                  caption, style);
+        if (fresh) {
+            pango_layout_set_alignment(text.layout.get(), Alignment(place.align));
+            Wrap(text, room, height);
+        }
+        return text;
+    }
+
+private:
+    static constexpr std::size_t kMostTexts = 512;
+    static constexpr std::size_t kLongestKept = 200;
+
+    std::pair<LaidText&, bool> Find(std::string key, const Caption& caption, const TextStyle& style) {
+        key += '\n' + KeyOf(style) + (style.underline ? "u" : "") + std::to_string(caption.from) + ',' +
+               std::to_string(caption.to) + '\n' + caption.text;
+        if (const auto found = texts_.find(key); found != texts_.end())
+            return {found->second, false};
+        if (texts_.size() >= kMostTexts) {
+            former_ = std::move(texts_);
+            texts_.clear();
+        }
+        if (auto found = former_.extract(key))
+            return {texts_.insert(std::move(found)).position->second, false};
+        LaidText& text = caption.text.size() <= kLongestKept ? texts_[key] : long_;
+        text = {std::unique_ptr<PangoLayout, Unref>(Fonts::Get().MakeLayout(style))};
+        pango_layout_set_text(text.layout.get(), caption.text.data(), static_cast<int>(caption.text.size()));
+        Underline(text.layout.get(), style, caption);
+        return {text, true};
+    }
+
+    std::unordered_map<std::string, LaidText> texts_;
+    std::unordered_map<std::string, LaidText> former_; ///< asked for before the present ones
+    LaidText long_; ///< the last long one
+};
+
+void Show(Canvas& canvas, PangoLayout* layout, Color color, int left, int top, double scale) {
+    auto* context = canvas.Context();
+    const auto part = [&](unsigned shift) { return static_cast<double>((color >> shift) & 0xFFU) / 255.0; };
+    cairo_set_source_rgb(context, part(16), part(8), part(0));
+    cairo_save(context);
+    cairo_translate(context, left, top);
+    cairo_scale(context, scale, 1);
+    cairo_move_to(context, 0, 0);
+    pango_cairo_show_layout(context, layout);
+    cairo_restore(context);
 }
 
 } // namespace
@@ -236,47 +309,23 @@ Fitted Fit(PangoLayout* layout, const TextPlace& place) {
 void DrawText(Canvas& canvas, std::string_view text, const TextStyle& style, const TextPlace& place) {
     if (text.empty() || !canvas.Visible(place.area))
         return;
-    auto* layout = Fonts::Get().Layout(style);
     Caption caption = place.accelerator ? TakeAccelerator(text) : Caption{std::string(text)};
     caption.text = Drawable(caption.text);
-    pango_layout_set_text(layout, caption.text.data(), static_cast<int>(caption.text.size()));
-    pango_layout_set_width(layout, place.wrap ? place.area.Width() * PANGO_SCALE : -1);
-    pango_layout_set_single_paragraph_mode(layout, place.wrap ? FALSE : TRUE);
-    pango_layout_set_alignment(layout, place.wrap ? Alignment(place.align) : PANGO_ALIGN_LEFT);
-    Underline(layout, style, caption);
-
-    const auto fitted = Fit(layout, place);
-    const int shown = static_cast<int>(fitted.width * fitted.scale + 0.5);
+    LaidText& laid =
+        place.wrap ? LaidTexts::Get().Lines(caption, style, place) : LaidTexts::Get().Line(caption, style);
+    const double scale = place.wrap ? laid.scale : ScaleToFit(laid.width, place.area.Width());
+    const int shown = static_cast<int>(laid.width * scale + 0.5);
     const int left = place.wrap ? place.area.left : LeftOf(place, shown);
     const int top = place.vertical == VerticalAlign::Top
                         ? place.area.top
-                        : place.area.top + std::max(0, (place.area.Height() - fitted.height) / 2);
-    {
-        const ClipTo clip(canvas, place.area);
-        auto* context = canvas.Context();
-        const auto part = [&](unsigned shift) {
-            return static_cast<double>((style.color >> shift) & 0xFFU) / 255.0;
-        };
-        cairo_set_source_rgb(context, part(16), part(8), part(0));
-        cairo_save(context);
-        cairo_translate(context, left, top);
-        cairo_scale(context, fitted.scale, 1);
-        cairo_move_to(context, 0, 0);
-        pango_cairo_show_layout(context, layout);
-        cairo_restore(context);
-    }
-    pango_layout_set_attributes(layout, nullptr);
+                        : place.area.top + std::max(0, (place.area.Height() - laid.height) / 2);
+    const ClipTo clip(canvas, place.area);
+    Show(canvas, laid.layout.get(), style.color, left, top, scale);
 }
 
 TextSize MeasureText(std::string_view text, const TextStyle& style) {
-    auto* layout = Fonts::Get().Layout(style);
-    const auto drawable = Drawable(text);
-    pango_layout_set_text(layout, drawable.data(), static_cast<int>(drawable.size()));
-    pango_layout_set_width(layout, -1);
-    pango_layout_set_single_paragraph_mode(layout, TRUE);
-    TextSize size;
-    pango_layout_get_pixel_size(layout, &size.width, &size.height);
-    return size;
+    const LaidText& laid = LaidTexts::Get().Line(Caption{Drawable(text)}, style);
+    return {laid.width, laid.height};
 }
 
 } // namespace tovimar::platform::painting

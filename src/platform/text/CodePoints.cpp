@@ -3,13 +3,26 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <cstring>
 #include <unicode/utf16.h>
 #include <unicode/utf8.h>
 
 namespace tovimar::text {
 
 bool IsAscii(std::string_view text) {
-    return std::all_of(text.begin(), text.end(), [](char byte) { return IsAscii(byte); });
+    return SkipAscii(text, 0) == text.size();
+}
+
+std::size_t SkipAscii(std::string_view text, std::size_t position) {
+    constexpr std::uint64_t kHighBits = 0x8080808080808080ULL;
+    for (std::uint64_t eight = 0; position + sizeof eight <= text.size(); position += sizeof eight) {
+        std::memcpy(&eight, text.data() + position, sizeof eight);
+        if ((eight & kHighBits) != 0)
+            break;
+    }
+    while (position < text.size() && IsAscii(text[position]))
+        ++position;
+    return position;
 }
 
 char32_t NextCodePoint(std::string_view text, std::size_t& position, bool* wellFormed) {
@@ -98,7 +111,7 @@ std::string FromUtf16(std::u16string_view text) {
 
 bool IsValidUtf8(std::string_view bytes) {
     bool wellFormed = true;
-    for (std::size_t i = 0; i < bytes.size() && wellFormed;)
+    for (std::size_t i = SkipAscii(bytes, 0); i < bytes.size() && wellFormed; i = SkipAscii(bytes, i))
         NextCodePoint(bytes, i, &wellFormed);
     return wellFormed;
 }

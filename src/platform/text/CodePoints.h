@@ -16,6 +16,8 @@ inline char LowerAscii(char byte) {
     return byte >= 'A' && byte <= 'Z' ? static_cast<char>(byte + 32) : byte;
 }
 bool IsAscii(std::string_view text);
+/// Behind the ASCII bytes that begin at `position`.
+std::size_t SkipAscii(std::string_view text, std::size_t position);
 
 /// The character at `position`, which moves behind it. A byte that doesn't fit counts alone and gives
 /// U+FFFD; `wellFormed`, when given, tells which of both it was.
