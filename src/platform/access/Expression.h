@@ -25,9 +25,11 @@ public:
     /// Records that an aggregate goes over, and the first of them.
     virtual int Rows() const { return 0; }
     virtual int FirstRow() const { return 0; }
-    /// A field of a table or query in its first record: DLookUp and its like. `function` is folded.
+    /// Of the records of a table or query that fulfil a condition, all with an empty one: DLookUp and its
+    /// like. `function` is folded.
     virtual std::optional<Datum> LookUp(const std::string& /*function*/, const std::string& /*expression*/,
-                                        const std::string& /*domain*/) const {
+                                        const std::string& /*domain*/,
+                                        const std::string& /*condition*/) const {
         return std::nullopt;
     }
 };

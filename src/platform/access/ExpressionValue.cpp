@@ -143,8 +143,11 @@ private:
         if (node.parts.size() < 2)
             return std::nullopt;
         const auto expression = Of(*node.parts[0]), domain = Of(*node.parts[1]);
-        return expression && domain ? scope_.LookUp(node.word, expression->AsText(), domain->AsText())
-                                    : std::nullopt;
+        if (!expression || !domain)
+            return std::nullopt;
+        // A condition that asks for something unknown is left out of account.
+        const auto condition = node.parts.size() > 2 ? Of(*node.parts[2]).value_or(Datum{}) : Datum{};
+        return scope_.LookUp(node.word, expression->AsText(), domain->AsText(), condition.AsText());
     }
 
     const ExpressionScope& scope_;

@@ -1,0 +1,161 @@
+#include "platform/painting/SampleData.h"
+#include "platform/painting/SampleText.h"
+#include "platform/text/Text.h"
+
+#include <algorithm>
+#include <charconv>
+
+/// What lists and combo boxes offer and show.
+namespace tovimar::platform::painting {
+
+using access::Datum;
+using access::DesignObject;
+using access::Records;
+
+namespace {
+
+constexpr std::size_t kMostColumns = 64;
+constexpr std::size_t kMostListed = 200;
+
+bool IsValueList(const DesignObject& control) {
+    return text::EqualsIgnoringCase(control.Text("RowSourceType"), "Value List");
+}
+
+/// Entries between semicolons (or commas), quotes around them taken off.
+std::vector<std::string> SplitValues(std::string_view list) {
+    std::vector<std::string> values;
+    std::string value;
+    bool quoted = false;
+    for (const char letter : list) {
+        if (letter == '"')
+            quoted = !quoted;
+        else if (letter == ';' && !quoted) {
+            values.push_back(text::Trim(value));
+            value.clear();
+        } else
+            value += letter;
+    }
+    if (!text::Trim(value).empty() || !values.empty())
+        values.push_back(text::Trim(value));
+    return values;
+}
+
+/// Twips of each column; -1 for one that the design doesn't measure.
+std::vector<int> ColumnWidths(const DesignObject& control, std::size_t columns) {
+    std::vector<int> widths(columns, -1);
+    const auto parts = text::Split(control.Text("ColumnWidths"), ";");
+    for (std::size_t i = 0; i < columns && i < parts.size(); ++i) {
+        int width = -1;
+        const auto part = text::Trim(parts[i]);
+        if (std::from_chars(part.data(), part.data() + part.size(), width).ec == std::errc())
+            widths[i] = width;
+    }
+    return widths;
+}
+
+std::size_t ColumnCount(const DesignObject& control) {
+    return static_cast<std::size_t>(
+        std::clamp(control.Integer("ColumnCount", 1), 1, static_cast<int>(kMostColumns)));
+}
+
+/// The first column with a width of its own or of the host's choosing.
+std::size_t ShownColumn(const std::vector<int>& widths) {
+    const auto shown = std::find_if(widths.begin(), widths.end(), [](int width) { return width != 0; });
+    return shown == widths.end() ? 0 : static_cast<std::size_t>(shown - widths.begin());
+}
+
+} // namespace
+
+const Records* SampleData::RowSource(const DesignObject& control) const {
+    const auto source = control.Text("RowSource");
+    if (application_ == nullptr || source.empty() ||
+        !text::EqualsIgnoringCase(control.Text("RowSourceType", "Table/Query"), "Table/Query"))
+        return nullptr;
+    return application_->FindRecords(source, kMostRecords);
+}
+
+/// The row of a list's source whose bound column holds a value; null when there is none.
+const std::vector<std::string>* SampleData::ListRow(const DesignObject& list,
+                                                    const std::string& value) const {
+    const auto* records = RowSource(list);
+    if (records == nullptr)
+        return nullptr;
+    const auto bound = static_cast<std::size_t>(std::max(1, list.Integer("BoundColumn", 1))) - 1;
+    for (const auto& cells : records->rows)
+        if (bound < cells.size() && text::EqualsIgnoringCase(cells[bound], value))
+            return &cells;
+    return nullptr;
+}
+
+/// What a combo box shows for a value: the column shown of the row whose bound column holds the value.
+/// A value that is known and isn't in the list shows nothing.
+std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value, int row,
+                                 bool known) const {
+    const auto widths = ColumnWidths(combo, ColumnCount(combo));
+    const auto shown = ShownColumn(widths);
+    const auto bound = static_cast<std::size_t>(std::max(1, combo.Integer("BoundColumn", 1))) - 1;
+    if (shown == bound)
+        return value;
+    if (IsValueList(combo)) {
+        const auto values = SplitValues(combo.Text("RowSource"));
+        for (std::size_t at = 0; at + widths.size() <= values.size(); at += widths.size())
+            if (bound < widths.size() && values[at + bound] == value)
+                return values[at + shown];
+        return value;
+    }
+    const auto* records = RowSource(combo);
+    if (records != nullptr && !records->rows.empty()) {
+        if (const auto* cells = ListRow(combo, value))
+            return shown < cells->size() ? (*cells)[shown] : std::string();
+        if (known)
+            return {};
+        const auto& cells = records->rows[static_cast<std::size_t>(std::max(0, row)) % records->rows.size()];
+        return shown < cells.size() ? cells[shown] : std::string();
+    }
+    const auto* name =
+        records != nullptr && shown < records->columns.size() ? &records->columns[shown].name : &combo.name;
+    return SampleText(SampleKind::Text, {}, *name, row);
+}
+
+SampleData::List SampleData::ListRows(const DesignObject& control) const {
+    List list;
+    const auto columns = ColumnCount(control);
+    list.widths = ColumnWidths(control, columns);
+    list.heads = control.Flag("ColumnHeads");
+    if (IsValueList(control)) {
+        const auto values = SplitValues(control.Text("RowSource"));
+        for (std::size_t at = 0; at < values.size() && list.rows.size() < kMostListed; at += columns) {
+            const auto end = std::min(values.size(), at + columns);
+            list.rows.emplace_back(values.begin() + static_cast<std::ptrdiff_t>(at),
+                                   values.begin() + static_cast<std::ptrdiff_t>(end));
+        }
+        return list;
+    }
+    const auto* records = RowSource(control);
+    if (records == nullptr || records->columns.empty()) {
+        list.heads = false;
+        if (!control.Text("RowSource").empty())
+            for (int row = 0; row < 4; ++row)
+                list.rows.emplace_back(columns, SampleText(SampleKind::Text, {}, control.name, row));
+        return list;
+    }
+    if (list.heads) {
+        auto& heads = list.rows.emplace_back();
+        for (std::size_t i = 0; i < columns && i < records->columns.size(); ++i)
+            heads.push_back(records->columns[i].name);
+    }
+    for (const auto& cells : records->rows)
+        if (list.rows.size() < kMostListed)
+            list.rows.emplace_back(
+                cells.begin(), cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
+    if (records->rows.empty())
+        for (int row = 0; row < 4; ++row) {
+            auto& cells = list.rows.emplace_back();
+            for (std::size_t i = 0; i < columns && i < records->columns.size(); ++i)
+                cells.push_back(
+                    SampleText(KindOf({}, records->columns[i].name), {}, records->columns[i].name, row));
+        }
+    return list;
+}
+
+} // namespace tovimar::platform::painting
