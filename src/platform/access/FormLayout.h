@@ -46,8 +46,8 @@ struct SectionHeights {
     /// Group sections of a report by their numbers from 5 on, absent ones left out. Headers lie above the
     /// detail from the outermost in, footers below it from the innermost out.
     std::map<int, int> groups;
-    /// Where a preview prints the first of each section, left and top within the client area. Empty in other
-    /// views.
+    /// Where a preview prints the first of each section, left and top within the client area; set by whoever
+    /// asks for places in a preview.
     std::map<int, std::pair<int, int>> printed;
 };
 /// Order from the top: header, page header, detail, page footer, footer.

@@ -1,5 +1,6 @@
 #include "platform/painting/ControlPainter.h"
 
+#include "platform/painting/PrintedGrowth.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
@@ -16,6 +17,11 @@ int Margin(const DesignObject& control, std::string_view property, int twipsPerP
 }
 
 constexpr int kPrintOnly = 1, kScreenOnly = 2;
+
+Rectangle Lengthened(Rectangle area, int pixels) {
+    area.bottom += pixels;
+    return area;
+}
 
 } // namespace
 
@@ -77,7 +83,7 @@ void ControlPainter::PaintKind(const Object& control, const Rectangle& area) {
     else if (control.Is("OptionGroup"))
         PaintGroup(control, area);
     else if (control.Is("Subform"))
-        PaintSubform(control, area);
+        PaintSubform(control, MayGrow(control) ? Lengthened(area, place_.growth) : area);
     else if (control.Is("Line"))
         PaintLine(control, area);
     else if (control.Is("Rectangle"))

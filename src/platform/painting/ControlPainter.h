@@ -18,6 +18,7 @@ struct SectionPlace {
     int offsetY = 0;         ///< of the section within the client area
     int row = 0;             ///< record, from 0
     Color ground = 0xFFFFFF; ///< the section's colour
+    int growth = 0;          ///< pixels that subreports gain
 };
 
 class ControlPainter {

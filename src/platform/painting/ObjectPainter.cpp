@@ -36,7 +36,7 @@ Color ObjectPainter::GroundOf(const DesignObject& section, bool alternate) const
 }
 
 void ObjectPainter::PaintControls(const DesignObject& section, int left, int top, const Rectangle& clip,
-                                  int row, Color ground) {
+                                  int row, Color ground, int growth) {
     const ClipTo clipped(canvas_, clip);
     SectionPlace place;
     place.frame = frame_;
@@ -45,6 +45,7 @@ void ObjectPainter::PaintControls(const DesignObject& section, int left, int top
     place.originY = top - frame_.sectionBarHeight;
     place.row = row;
     place.ground = ground;
+    place.growth = growth;
     ControlPainter(context_, sample_, place).PaintChildren(section);
 }
 
@@ -155,27 +156,24 @@ void ObjectPainter::PaintPreview(const Rectangle& area) {
     canvas_.Fill(Moved(sheet, 3, 3), 0x808080);
     canvas_.Fill(sheet, SystemColor::kWindow);
     canvas_.Border(sheet, 0x606060);
-    const int width = PixelsOf(*context_.design.root, "Width", context_.metrics.twipsPerPixelX);
-    for (const auto& section : page.sections) {
-        const int left = sheet.left + page.left, top = sheet.top + section.top;
-        const Rectangle place{left, top, left + width, top + section.height};
-        const auto ground = GroundOf(*section.object, section.alternate);
-        canvas_.Fill(place, ground);
-        sample_.LimitAggregates(section.firstAdded, section.added);
-        PaintControls(*section.object, left, top, place, section.row, ground);
-    }
+    for (const auto& section : page.sections)
+        PaintPrinted(section, sheet.left + page.left, sheet.top, sheet.right);
 }
 
 void ObjectPainter::PaintPrintedBody(const Rectangle& area) {
     PaintFormBackground(area);
-    for (const auto& section : PlanPrintedBody(context_.design, sample_, context_.metrics)) {
-        const int top = area.top + section.top;
-        const Rectangle place{area.left, top, area.right, top + section.height};
-        const auto ground = GroundOf(*section.object, section.alternate);
-        canvas_.Fill(place, ground);
-        sample_.LimitAggregates(section.firstAdded, section.added);
-        PaintControls(*section.object, area.left, top, place, section.row, ground);
-    }
+    for (const auto& section : PlanPrintedBody(context_.design, sample_, context_.metrics))
+        PaintPrinted(section, area.left, area.top, area.right);
+}
+
+void ObjectPainter::PaintPrinted(const PrintedSection& section, int left, int top, int right) {
+    const Rectangle place{left + section.left, top + section.top,
+                          std::min(right, left + section.left + section.width),
+                          top + section.top + section.height};
+    const auto ground = GroundOf(*section.object, section.alternate);
+    canvas_.Fill(place, ground);
+    sample_.LimitAggregates(section.firstAdded, section.added);
+    PaintControls(*section.object, place.left, place.top, place, section.row, ground, section.growth);
 }
 
 } // namespace tovimar::platform::painting

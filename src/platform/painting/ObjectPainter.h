@@ -8,6 +8,8 @@
 
 namespace tovimar::platform::painting {
 
+struct PrintedSection;
+
 /// Paints one form or report into the client area of its window or into the frame of a subform.
 class ObjectPainter {
 public:
@@ -27,10 +29,12 @@ private:
     void PaintCell(const access::DesignObject& column, const Rectangle& cell, int row);
     void PaintPreview(const Rectangle& area);
     void PaintPrintedBody(const Rectangle& area);
+    /// A section of a sheet whose body begins at (left, top).
+    void PaintPrinted(const PrintedSection& section, int left, int top, int right);
     Color GroundOf(const access::DesignObject& section, bool alternate) const;
     /// Controls of a section whose content begins at `top`.
     void PaintControls(const access::DesignObject& section, int left, int top, const Rectangle& clip, int row,
-                       Color ground);
+                       Color ground, int growth = 0);
 
     const PaintContext& context_;
     Canvas& canvas_;

@@ -47,9 +47,7 @@ int OpenObject::ShownRecords(const SystemMetrics& metrics) const {
 }
 
 SectionHeights OpenObject::Sections(const SystemMetrics& metrics) const {
-    auto heights = painting::HeightsOf(*design, view, ShownRecords(metrics), metrics);
-    heights.printed = PrintedSections(metrics, false);
-    return heights;
+    return painting::HeightsOf(*design, view, ShownRecords(metrics), metrics);
 }
 
 std::map<int, std::pair<int, int>> OpenObject::PrintedSections(const SystemMetrics& metrics,
@@ -58,15 +56,17 @@ std::map<int, std::pair<int, int>> OpenObject::PrintedSections(const SystemMetri
     if (view != View::Preview || design == nullptr || !design->root)
         return places;
     const painting::SampleData sample(*design, application);
-    auto page = painting::PlanReportPage(*design, sample, metrics);
+    painting::ReportPage page;
     if (nested)
         page.sections = painting::PlanPrintedBody(*design, sample, metrics);
+    else
+        page = painting::PlanReportPage(*design, sample, metrics);
     const int left = nested ? 0 : painting::kDeskMargin + page.left, top = nested ? 0 : painting::kDeskMargin;
     std::map<const DesignObject*, int> numbers;
     for (const auto& section : design->Sections())
         numbers[section.object] = section.number;
     for (const auto& section : page.sections)
-        places.emplace(numbers[section.object], std::pair(left, top + section.top));
+        places.emplace(numbers[section.object], std::pair(left + section.left, top + section.top));
     return places;
 }
 

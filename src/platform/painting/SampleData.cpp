@@ -84,10 +84,26 @@ Datum SampleData::Calculated(const DesignObject& control, std::string_view expre
     return Guess(control, parsed && parsed->HasAggregate() ? "count" : control.name, row);
 }
 
+/// The sum from the first record of the group, or of all, to this one.
+Datum SampleData::RunningSum(const DesignObject& control, std::string_view source, int row) const {
+    constexpr int kWithinGroup = 1;
+    const int first = control.Integer("RunningSum", 0) == kWithinGroup ? FirstOfGroup(row) : 0;
+    if (source == "=1")
+        return Datum::Number(row - first + 1);
+    const bool calculated = source.starts_with('=');
+    double sum = 0;
+    for (int at = first; at <= row; ++at) {
+        const auto value = calculated ? Calculated(control, source.substr(1), at)
+                                      : FieldValue(source, at).value_or(Guess(control, source, at));
+        sum += value.AsNumber().value_or(0);
+    }
+    return Datum::Number(sum);
+}
+
 Datum SampleData::ValueOf(const DesignObject& control, int row) const {
     const auto source = control.Text("ControlSource");
-    if (source == "=1" && control.Integer("RunningSum", 0) != 0)
-        return Datum::Number(row + 1);
+    if (control.Integer("RunningSum", 0) != 0 && !source.empty())
+        return RunningSum(control, source, row);
     if (source.starts_with('='))
         return Calculated(control, std::string_view(source).substr(1), row);
     if (!source.empty()) {

@@ -16,16 +16,21 @@ struct RecordLink {
     std::string value;
 };
 
+/// Objects and controls that ask for each other's values go so deep.
+inline constexpr int kDeepestSample = 4;
+
 class SampleData {
 public:
-    /// `application` may be null. Links that no record fulfils are left out of account: a subform with the
-    /// wrong records tells more than an empty one. `depth` counts the objects that ask for each other's
-    /// values.
+    /// `application` may be null. Links that no record fulfils leave a subreport without records; a subform
+    /// shows all then, since the wrong records tell more than none. `depth` counts the objects that ask for
+    /// each other's values.
     SampleData(const access::Design& design, access::ApplicationSource* application,
                const std::vector<RecordLink>& links = {}, int depth = 0);
 
     /// Number of records at hand (at most `kMostRecords`), -1 when they can't be had.
     int RecordCount() const;
+    access::ApplicationSource* Application() const { return application_; }
+    int Depth() const { return depth_; }
     /// Aggregates go over `count` records from `first` on, over all with a count of 0.
     void LimitAggregates(int first, int count);
     /// The text that tells the groups of a report apart at a level from 0; empty without a group there.
@@ -65,12 +70,24 @@ private:
     const std::vector<std::string>* ListRow(const access::DesignObject& list, const std::string& value) const;
     const access::DesignObject* FindControl(std::string_view name) const;
     void KeepLinked(const std::vector<RecordLink>& links);
+    void FindGroups();
     void SortByGroups();
+    int FirstOfGroup(int row) const;
+    std::optional<access::Datum> LinkValue(const access::DesignObject& control, int row) const;
+    access::Datum RunningSum(const access::DesignObject& control, std::string_view source, int row) const;
 
     const access::Design& design_;
     access::ApplicationSource* application_;
     const access::Records* records_ = nullptr;
     std::vector<int> rows_; ///< numbers of the records shown, in their order
+    /// Levels of a report by their order.
+    struct Group {
+        int column = -1; ///< -1 where the level isn't a field's
+        bool descending = false;
+        bool printed = false; ///< has a header or footer
+    };
+    std::vector<Group> groups_;
+    bool noneLinked_ = false;
     int firstAdded_ = 0, added_ = 0;
     int depth_;
     mutable int asked_ = 0; ///< controls that are asking for each other's values

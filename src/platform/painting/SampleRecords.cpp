@@ -3,6 +3,7 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <map>
 #include <numeric>
 
 /// Which records an object shows, and in what order.
@@ -22,6 +23,7 @@ SampleData::SampleData(const access::Design& design, access::ApplicationSource* 
         records_ = application_->FindRecords(source, kMostRecords);
     if (records_ == nullptr)
         return;
+    FindGroups();
     KeepLinked(links);
     if (design.kind == access::ObjectKind::Report)
         SortByGroups();
@@ -39,60 +41,104 @@ void SampleData::KeepLinked(const std::vector<RecordLink>& links) {
     for (std::size_t row = 0; row < records_->rows.size(); ++row)
         if (fulfils(records_->rows[row]))
             rows_.push_back(static_cast<int>(row));
-    for (std::size_t row = 0; rows_.empty() && row < records_->rows.size(); ++row)
-        rows_.resize(records_->rows.size()), std::iota(rows_.begin(), rows_.end(), 0);
+    noneLinked_ = rows_.empty() && !records_->rows.empty() && design_.kind == access::ObjectKind::Report;
+    if (rows_.empty() && !noneLinked_) {
+        rows_.resize(records_->rows.size());
+        std::iota(rows_.begin(), rows_.end(), 0);
+    }
+}
+
+void SampleData::FindGroups() {
+    for (const auto& child : design_.root->children)
+        if (child->Is("BreakLevel"))
+            groups_.push_back({records_->ColumnIndex(FieldName(child->Text("ControlSource"))),
+                               child->Flag("SortOrder"),
+                               child->Flag("GroupHeader") || child->Flag("GroupFooter")});
 }
 
 std::string SampleData::GroupKey(int level, int row) const {
-    int at = 0;
-    for (const auto& child : design_.root->children)
-        if (child->Is("BreakLevel") && at++ == level)
-            return FieldValue(child->Text("ControlSource"), row).value_or(Datum{}).AsText();
-    return {};
+    const auto at = static_cast<std::size_t>(level);
+    if (at >= groups_.size() || groups_[at].column < 0 || rows_.empty())
+        return {};
+    const auto number = rows_[static_cast<std::size_t>(std::max(0, row)) % rows_.size()];
+    const auto& cells = records_->rows[static_cast<std::size_t>(number)];
+    const auto column = static_cast<std::size_t>(groups_[at].column);
+    return column < cells.size() ? cells[column] : std::string();
 }
+
+/// The first record that shares all printed groups with this one.
+int SampleData::FirstOfGroup(int row) const {
+    const auto same = [&](int other) {
+        for (std::size_t level = 0; level < groups_.size(); ++level)
+            if (groups_[level].printed &&
+                GroupKey(static_cast<int>(level), other) != GroupKey(static_cast<int>(level), row))
+                return false;
+        return true;
+    };
+    while (row > 0 && same(row - 1))
+        --row;
+    return row;
+}
+
+namespace {
+
+/// Of each record its place among the values of a column; nulls come first.
+std::vector<int> RanksOf(const Records& records, std::size_t column) {
+    std::map<std::string_view, int> ranks;
+    const auto text = [&](const std::vector<std::string>& cells) {
+        return column < cells.size() ? std::string_view(cells[column]) : std::string_view();
+    };
+    for (const auto& cells : records.rows)
+        ranks.emplace(text(cells), 0);
+    std::vector<std::pair<Datum, int*>> values;
+    for (auto& [value, rank] : ranks)
+        values.emplace_back(access::DatumOf(std::string(value), records.columns[column].type), &rank);
+    const auto before = [](const auto& left, const auto& right) {
+        return left.first.IsNull() || right.first.IsNull()
+                   ? left.first.IsNull() && !right.first.IsNull()
+                   : access::Compare(left.first, right.first).value_or(0) < 0;
+    };
+    std::stable_sort(values.begin(), values.end(), before);
+    for (std::size_t i = 0; i < values.size(); ++i)
+        *values[i].second = i == 0 ? 0 : *values[i - 1].second + (before(values[i - 1], values[i]) ? 1 : 0);
+    std::vector<int> found;
+    for (const auto& cells : records.rows)
+        found.push_back(ranks[text(cells)]);
+    return found;
+}
+
+} // namespace
 
 /// A report prints its records in the order of its groups.
 void SampleData::SortByGroups() {
-    std::vector<std::pair<std::size_t, bool>> columns;
-    for (const auto& child : design_.root->children) {
-        const int column =
-            child->Is("BreakLevel") ? records_->ColumnIndex(FieldName(child->Text("ControlSource"))) : -1;
-        if (column >= 0)
-            columns.emplace_back(static_cast<std::size_t>(column), child->Flag("SortOrder"));
-    }
-    if (columns.empty())
-        return;
-    std::vector<std::vector<Datum>> keys(records_->rows.size());
-    for (const int row : rows_) {
-        const auto at = static_cast<std::size_t>(row);
-        for (const auto& [column, descending] : columns) {
-            const auto& cells = records_->rows[at];
-            const auto type = records_->columns[column].type;
-            keys[at].push_back(column < cells.size() ? access::DatumOf(cells[column], type) : Datum{});
-        }
-    }
+    std::vector<std::pair<std::vector<int>, bool>> keys;
+    for (const auto& group : groups_)
+        if (group.column >= 0)
+            keys.emplace_back(RanksOf(*records_, static_cast<std::size_t>(group.column)), group.descending);
     std::stable_sort(rows_.begin(), rows_.end(), [&](int left, int right) {
-        for (std::size_t i = 0; i < columns.size(); ++i) {
-            const auto& a = keys[static_cast<std::size_t>(left)][i];
-            const auto& b = keys[static_cast<std::size_t>(right)][i];
-            // Nulls come first.
-            const int order = a.IsNull() || b.IsNull()
-                                  ? static_cast<int>(b.IsNull()) - static_cast<int>(a.IsNull())
-                                  : access::Compare(a, b).value_or(0);
-            if (order != 0)
-                return columns[i].second ? order > 0 : order < 0;
+        for (const auto& [ranks, descending] : keys) {
+            const int a = ranks[static_cast<std::size_t>(left)], b = ranks[static_cast<std::size_t>(right)];
+            if (a != b)
+                return descending ? a > b : a < b;
         }
         return false;
     });
 }
 
 int SampleData::RecordCount() const {
-    return rows_.empty() ? -1 : static_cast<int>(rows_.size());
+    return noneLinked_ ? 0 : rows_.empty() ? -1 : static_cast<int>(rows_.size());
 }
 
 void SampleData::LimitAggregates(int first, int count) {
     firstAdded_ = first;
     added_ = count;
+}
+
+/// What a control tells a subform: its field, or what it works out without asking around.
+std::optional<Datum> SampleData::LinkValue(const DesignObject& control, int row) const {
+    const auto source = control.Text("ControlSource");
+    const bool constant = source.starts_with('=') && source.find('[') == std::string::npos;
+    return constant ? Calculated(control, source.substr(1), row) : FieldValue(source, row);
 }
 
 std::vector<RecordLink> SampleData::LinksOf(const DesignObject& subform, int row) const {
@@ -104,7 +150,7 @@ std::vector<RecordLink> SampleData::LinksOf(const DesignObject& subform, int row
         auto value = FieldValue(field, row);
         const auto* control = value ? nullptr : FindControl(field);
         if (control != nullptr)
-            value = FieldValue(control->Text("ControlSource"), row);
+            value = LinkValue(*control, row);
         if (value && !value->IsNull())
             links.push_back({children[i], value->AsText()});
     }

@@ -14,8 +14,6 @@ using access::Records;
 namespace {
 
 constexpr int kSampleRows = 4;
-/// Objects and controls that ask for each other's values.
-constexpr int kDeepest = 4;
 
 /// The records of a table or query that fulfil a condition, for a function that looks into it.
 class DomainScope : public access::ExpressionScope {
@@ -68,7 +66,7 @@ std::optional<Datum> SampleData::Scope::Named(const std::string& name, int row) 
     if (text::EqualsIgnoringCase(name, "Page") || text::EqualsIgnoringCase(name, "Pages"))
         return Datum::Number(1);
     const auto* control = data_.FindControl(name);
-    if (control != nullptr && control != &control_ && data_.asked_ < kDeepest) {
+    if (control != nullptr && control != &control_ && data_.asked_ < kDeepestSample) {
         ++data_.asked_;
         auto value = data_.ValueOf(*control, row);
         --data_.asked_;
@@ -80,7 +78,7 @@ std::optional<Datum> SampleData::Scope::Named(const std::string& name, int row) 
 std::optional<Datum> SampleData::Scope::InSubform(const access::NamePath& name) const {
     const auto* subform = data_.FindControl(name[name.size() > 2 ? name.size() - 3 : 0]);
     if (subform == nullptr || !subform->Is("Subform") || data_.application_ == nullptr ||
-        data_.depth_ >= kDeepest)
+        data_.depth_ >= kDeepestSample)
         return std::nullopt;
     const auto source = subform->Text("SourceObject");
     const auto* design =

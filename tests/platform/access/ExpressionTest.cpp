@@ -30,8 +30,9 @@ public:
     }
     int Rows() const override { return 2; }
     std::optional<Datum> LookUp(const std::string& function, const std::string& field,
-                                const std::string& domain) const override {
-        return Datum::Text(function + " " + field + " " + domain);
+                                const std::string& domain, const std::string& condition) const override {
+        return Datum::Text(function + " " + field + " " + domain +
+                           (condition.empty() ? "" : " " + condition));
     }
 };
 
@@ -67,6 +68,7 @@ TEST(Expressions, AreWorkedOutAsTheHostDoes) {
         {"[Unknown]=1 And 1=2", "False"},
         {"[Unknown]=1 Or 1=2", "unknown"},
         {"DLookUp(\"[Title]\",\"Settings\")", "dlookup [Title] Settings"},
+        {"DSum(\"Fee\",\"Settings\",\"No=\" & 4)", "dsum Fee Settings No=4"},
         {"1/0", "unknown"},
         {"\"open", "open"},
         {"", "no expression"},

@@ -80,7 +80,8 @@ public:
     }
     platform::Rectangle PlaceOf(const platform::access::DesignObject& control, int section) const {
         const auto frame = platform::access::ComputeFrame(windows.Metrics(), object.FrameSettings());
-        const auto heights = object.Sections(windows.Metrics());
+        auto heights = object.Sections(windows.Metrics());
+        heights.printed = object.PrintedSections(windows.Metrics(), false);
         const int offset = platform::access::SectionOffsetY(heights, frame.sectionBarHeight, section);
         const int right = platform::access::SectionOffsetX(heights, section);
         auto place = platform::access::ControlRectangle(windows.Metrics(), frame, offset,

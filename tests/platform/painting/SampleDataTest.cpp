@@ -47,6 +47,8 @@ protected:
                           Box("Total", "=[Goods]+[Rebate]+Nz([Fee],0)", "Format =\"Currency\"\n") +
                           Box("Day", "Day", "Format =\"Medium Date\"\n") +
                           Box("Title", "=DLookUp(\"[Name]\",\"Customers\") & DCount(\"*\",\"Customers\")") +
+                          Box("Second", "=DLookUp(\"Name\",\"Customers\",\"[ID]=\" & [Customer])") +
+                          Box("None", "=DCount(\"*\",\"Customers\",\"[Rebate]>1\")") +
                           Box("Loop", "=[Pool]+1") + Box("Pool", "=[Loop]+1") + "End\nEnd\nEnd\nEnd\n");
     }
 
@@ -70,6 +72,8 @@ TEST_F(ShopTest, ControlsShowWhatTheirExpressionsComeTo) {
     EXPECT_EQ(text("Day", 0), "04-Mar-24");
     EXPECT_EQ(text("Day", 1), "");
     EXPECT_EQ(text("Title", 0), "Miller2");
+    EXPECT_EQ(text("Second", 0), "Brown") << "the customer that the condition names";
+    EXPECT_EQ(text("None", 0), "0");
     EXPECT_FALSE(text("Loop", 0).empty()) << "two that ask for each other come to an end";
     EXPECT_TRUE(sample.AlignsRight(Control(*orders, "Total"), 0));
     EXPECT_FALSE(sample.AlignsRight(Control(*orders, "Title"), 0));
