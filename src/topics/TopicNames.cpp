@@ -28,6 +28,10 @@ std::string WithoutEncodedMarks(const std::string& caption) {
 
 } // namespace
 
+std::string WithoutTags(const std::string& text) {
+    return text::ReplaceAll(text::ReplaceAll(text, "<", "&lt;"), ">", "&gt;");
+}
+
 std::string StripAccelerators(std::string_view caption, bool vfEncoded) {
     std::string kept;
     kept.reserve(caption.size());
@@ -44,11 +48,11 @@ std::string FormBookmarkPrefix(const CXmlForm& form) {
 }
 
 std::string FormDisplayName(const CXmlForm& form) {
-    return StripAccelerators(definition::IdentifiedByName() ? form.Name : form.Caption());
+    return WithoutTags(StripAccelerators(definition::IdentifiedByName() ? form.Name : form.Caption()));
 }
 
 std::string MenuDisplayName(const CXmlMenu& menu) {
-    return StripAccelerators(definition::IdentifiedByName() ? menu.Name : menu.Text);
+    return WithoutTags(StripAccelerators(definition::IdentifiedByName() ? menu.Name : menu.Text));
 }
 
 std::string ControlDisplayName(const CXmlControl& ctl) {
@@ -56,7 +60,7 @@ std::string ControlDisplayName(const CXmlControl& ctl) {
     const bool byName = definition::IdentifiedByName();
     const std::string& wanted = byName ? ctl.Name : caption;
     const std::string& other = byName ? caption : ctl.Name;
-    return StripAccelerators(wanted.empty() ? other : wanted);
+    return WithoutTags(StripAccelerators(wanted.empty() ? other : wanted));
 }
 
 std::string ControlBookmark(const CXmlControl& ctl) {

@@ -13,6 +13,10 @@ class CXmlMenu;
 /// none, a numeric entity stands. With `vfEncoded`, "&#38;" counts as a mark too.
 std::string StripAccelerators(std::string_view caption, bool vfEncoded = true);
 
+/// Angle brackets as references: names go into pages as they stand, but for what would open a tag there, as
+/// the caption of a button "<New>" would.
+std::string WithoutTags(const std::string& text);
+
 /// Names that a topic shows or links by. The shown ones follow the option that says whether objects and
 /// controls go by caption or by name.
 std::string FormBookmarkPrefix(const CXmlForm& form);

@@ -79,8 +79,7 @@ void TopicSections::AppendArea(std::string& out, const std::string& prefix, cons
         out.append(i == 0 ? "" : ",").append(std::to_string(corners[i]));
     out.append("\" HREF=\"#").append(prefix).append("_").append(ControlBookmark(control));
     // The text goes in as it stands, but for what would end the attribute or upset a compiler's reader.
-    const std::string alt =
-        text::ReplaceAll(text::ReplaceAll(AreaName(control), "\"", "&quot;"), "<", "&lt;");
+    const std::string alt = WithoutTags(text::ReplaceAll(AreaName(control), "\"", "&quot;"));
     out.append("\" FRAME=\"\" alt=\"").append(alt).append("\" />");
 }
 

@@ -108,7 +108,8 @@ TEST_F(TemplatesTest, PagesNameEachPictureAndArea) {
          {"<IMG SRC=\"images\\F.jpg\" BORDER=0 \r\nUSEMAP=\"#F\" ALT=\"Say &#34;Hi&#34; &#38; go\" />",
           "USEMAP=\"#F_g\" ALT=\"A &#60;b&#62; &#34;c&#34;\" />",
           "HREF=\"#F_txtBare\" FRAME=\"\" alt=\"txtBare\" />",
-          "HREF=\"#F_g\" FRAME=\"\" alt=\"A &lt;b> &quot;c&quot;\" />"})
+          "HREF=\"#F_g\" FRAME=\"\" alt=\"A &lt;b&gt; &quot;c&quot;\" />",
+          "<H2><a name=\"F_g\">A &lt;b&gt; \"c\"</a></H2>"})
         EXPECT_NE(std::string::npos, page.find(part)) << part << page;
     // The pieces on their own are what earlier versions wrote.
     EXPECT_EQ(std::string::npos, templates.MainImage(*form, true, "").find("ALT"));
