@@ -48,7 +48,7 @@ public:
                                                       {"Count", &Components::ReadCount}};
         return kMembers;
     }
-    Value Find(const Value& key) {
+    Value At(const Value& key) {
         const auto name = key.IsInteger() ? NameAt(key.AsInteger()) : key.AsString();
         const auto code = CodeOf(Live(session_)->Model(), name);
         if (!code)
@@ -73,7 +73,7 @@ private:
         const bool known = position >= 1 && static_cast<std::size_t>(position) <= names.size();
         return known ? names[static_cast<std::size_t>(position) - 1] : std::string();
     }
-    Value ReadItem(const Arguments& arguments) { return Find(ArgumentAt(arguments, 0)); }
+    Value ReadItem(const Arguments& arguments) { return At(ArgumentAt(arguments, 0)); }
     Value ReadCount(const Arguments&) { return static_cast<std::int32_t>(Names().size()); }
 
     SessionRef session_;
@@ -93,7 +93,7 @@ private:
     Value ReadName(const Arguments&) { return Live(session_)->Model().ProjectName(); }
     Value ReadComponents(const Arguments& arguments) {
         const auto components = std::make_shared<Components>(session_);
-        return arguments.empty() ? ObjectValue(components) : components->Find(arguments[0]);
+        return arguments.empty() ? ObjectValue(components) : components->At(arguments[0]);
     }
 
     SessionRef session_;
