@@ -209,6 +209,8 @@ std::optional<std::string> NamedNumber(double value, std::string_view format) {
         return sign + Digits(value, 2, true);
     if (is("Percent"))
         return sign + Digits(value * 100, 2, false) + "%";
+    if (is("General Number") || is("Scientific"))
+        return Datum::Number(value).AsText();
     if (is("Fixed"))
         return sign + Digits(value, 2, false);
     if (is("Yes/No"))

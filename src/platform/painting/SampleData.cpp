@@ -50,10 +50,26 @@ const DesignObject* SampleData::FindControl(std::string_view name) const {
     return nullptr;
 }
 
+namespace {
+
+/// What tells most about a field: its name, the caption beside its control, or the control's name.
+std::string TellingName(const DesignObject& control, const std::string& field) {
+    if (SaysItsKind(field))
+        return field;
+    for (const auto& child : control.children)
+        if (const auto caption = text::ReplaceAll(child->Text("Caption"), "&", "");
+            child->Is("Label") && SaysItsKind(caption))
+            return caption;
+    return SaysItsKind(control.name) ? control.name : field;
+}
+
+} // namespace
+
 Datum SampleData::Guess(const DesignObject& control, std::string_view field, int row) const {
-    const auto name = FieldName(field);
+    const auto fieldName = FieldName(field);
+    const auto name = TellingName(control, fieldName);
     const auto format = control.Text("Format");
-    const int column = records_ == nullptr ? -1 : records_->ColumnIndex(name);
+    const int column = records_ == nullptr ? -1 : records_->ColumnIndex(fieldName);
     auto kind = KindOf(format, name);
     auto type =
         column < 0 ? Records::Type::Unknown : records_->columns[static_cast<std::size_t>(column)].type;
@@ -119,15 +135,14 @@ Datum SampleData::ValueOf(const DesignObject& control, int row) const {
 }
 
 std::string SampleData::Text(const DesignObject& control, int row) const {
+    const auto source = control.Text("ControlSource");
+    const bool combo = control.Is("ComboBox");
+    if (combo && !source.empty() && !source.starts_with('=') && !FieldValue(source, row))
+        if (auto offered = Offered(control, row))
+            return *offered;
     const auto value = ValueOf(control, row);
-    if (control.Is("ComboBox")) {
-        const auto source = control.Text("ControlSource");
-        const bool known = source.empty() || FieldValue(source, row).has_value();
-        return value.IsNull()
-                   ? std::string()
-                   : LookedUp(control, access::FormatDatum(value, control.Text("Format")), row, known);
-    }
-    return access::FormatDatum(value, control.Text("Format"));
+    const auto text = access::FormatDatum(value, control.Text("Format"));
+    return combo && !value.IsNull() ? LookedUp(control, text) : text;
 }
 
 bool SampleData::Checked(const DesignObject& control, int row) const {

@@ -64,8 +64,8 @@ private:
     access::Datum Guess(const access::DesignObject& control, std::string_view field, int row) const;
     access::Datum ValueOf(const access::DesignObject& control, int row) const;
     access::Datum Calculated(const access::DesignObject& control, std::string_view expression, int row) const;
-    std::string LookedUp(const access::DesignObject& combo, const std::string& value, int row,
-                         bool known) const;
+    std::string LookedUp(const access::DesignObject& combo, const std::string& value) const;
+    std::optional<std::string> Offered(const access::DesignObject& combo, int row) const;
     const access::Records* RowSource(const access::DesignObject& control) const;
     const std::vector<std::string>* ListRow(const access::DesignObject& list, const std::string& value) const;
     const access::DesignObject* FindControl(std::string_view name) const;

@@ -1,5 +1,4 @@
 #include "platform/painting/SampleData.h"
-#include "platform/painting/SampleText.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
@@ -17,8 +16,12 @@ namespace {
 constexpr std::size_t kMostColumns = 64;
 constexpr std::size_t kMostListed = 200;
 
+constexpr int kValueList = 1;
+
+/// Exports spell the kind of a list out or number it.
 bool IsValueList(const DesignObject& control) {
-    return text::EqualsIgnoringCase(control.Text("RowSourceType"), "Value List");
+    return control.Integer("RowSourceTypeInt", 0) == kValueList ||
+           text::EqualsIgnoringCase(control.Text("RowSourceType"), "Value List");
 }
 
 /// Entries between semicolons (or commas), quotes around them taken off.
@@ -88,9 +91,8 @@ const std::vector<std::string>* SampleData::ListRow(const DesignObject& list,
 }
 
 /// What a combo box shows for a value: the column shown of the row whose bound column holds the value.
-/// A value that is known and isn't in the list shows nothing.
-std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value, int row,
-                                 bool known) const {
+/// A value that isn't in the list shows nothing.
+std::string SampleData::LookedUp(const DesignObject& combo, const std::string& value) const {
     const auto widths = ColumnWidths(combo, ColumnCount(combo));
     const auto shown = ShownColumn(widths);
     const auto bound = static_cast<std::size_t>(std::max(1, combo.Integer("BoundColumn", 1))) - 1;
@@ -103,18 +105,24 @@ std::string SampleData::LookedUp(const DesignObject& combo, const std::string& v
                 return values[at + shown];
         return value;
     }
-    const auto* records = RowSource(combo);
-    if (records != nullptr && !records->rows.empty()) {
-        if (const auto* cells = ListRow(combo, value))
-            return shown < cells->size() ? (*cells)[shown] : std::string();
-        if (known)
-            return {};
-        const auto& cells = records->rows[static_cast<std::size_t>(std::max(0, row)) % records->rows.size()];
-        return shown < cells.size() ? cells[shown] : std::string();
+    const auto* cells = ListRow(combo, value);
+    return cells != nullptr && shown < cells->size() ? (*cells)[shown] : std::string();
+}
+
+/// What a combo box may well show in a record of which nothing is known: an entry of its list.
+std::optional<std::string> SampleData::Offered(const DesignObject& combo, int row) const {
+    const auto widths = ColumnWidths(combo, ColumnCount(combo));
+    const auto shown = ShownColumn(widths), number = static_cast<std::size_t>(std::max(0, row));
+    if (IsValueList(combo)) {
+        const auto values = SplitValues(combo.Text("RowSource"));
+        const auto entries = values.size() / widths.size();
+        return entries == 0 ? std::nullopt : std::optional(values[number % entries * widths.size() + shown]);
     }
-    const auto* name =
-        records != nullptr && shown < records->columns.size() ? &records->columns[shown].name : &combo.name;
-    return SampleText(SampleKind::Text, {}, *name, row);
+    const auto* records = RowSource(combo);
+    if (records == nullptr || records->rows.empty())
+        return std::nullopt;
+    const auto& cells = records->rows[number % records->rows.size()];
+    return shown < cells.size() ? std::optional(cells[shown]) : std::nullopt;
 }
 
 SampleData::List SampleData::ListRows(const DesignObject& control) const {
@@ -134,9 +142,6 @@ SampleData::List SampleData::ListRows(const DesignObject& control) const {
     const auto* records = RowSource(control);
     if (records == nullptr || records->columns.empty()) {
         list.heads = false;
-        if (!control.Text("RowSource").empty())
-            for (int row = 0; row < 4; ++row)
-                list.rows.emplace_back(columns, SampleText(SampleKind::Text, {}, control.name, row));
         return list;
     }
     if (list.heads) {
@@ -148,13 +153,6 @@ SampleData::List SampleData::ListRows(const DesignObject& control) const {
         if (list.rows.size() < kMostListed)
             list.rows.emplace_back(
                 cells.begin(), cells.begin() + static_cast<std::ptrdiff_t>(std::min(columns, cells.size())));
-    if (records->rows.empty())
-        for (int row = 0; row < 4; ++row) {
-            auto& cells = list.rows.emplace_back();
-            for (std::size_t i = 0; i < columns && i < records->columns.size(); ++i)
-                cells.push_back(
-                    SampleText(KindOf({}, records->columns[i].name), {}, records->columns[i].name, row));
-        }
     return list;
 }
 

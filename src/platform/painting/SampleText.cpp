@@ -2,6 +2,7 @@
 
 #include "platform/text/Text.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
@@ -21,7 +22,7 @@ struct Hint {
 };
 
 /// The first hint whose word is found counts, so longer words come first.
-constexpr std::array<Hint, 44> kHints{{
+constexpr std::array<Hint, 58> kHints{{
     {"email",
      SampleKind::Text,
      {"anna@example.com", "peter@example.com", "maria@example.com", "john@example.com"}},
@@ -51,7 +52,16 @@ constexpr std::array<Hint, 44> kHints{{
     {"first name", SampleKind::Text, {"Anna", "Peter", "Maria", "John"}},
     {"fullname", SampleKind::Text, {"Anna Miller", "Peter Brown", "Maria Garcia", "John Walker"}},
     {"given", SampleKind::Text, {"Anna", "Peter", "Maria", "John"}},
+    {"full path",
+     SampleKind::Text,
+     {"C:\\Data\\Report.txt", "C:\\Data\\List.csv", "C:\\Data\\Export.txt", "C:\\Data\\Data.csv"}},
+    {"fullpath",
+     SampleKind::Text,
+     {"C:\\Data\\Report.txt", "C:\\Data\\List.csv", "C:\\Data\\Export.txt", "C:\\Data\\Data.csv"}},
+    {"directory", SampleKind::Text, {"C:\\Data", "C:\\Data\\2023", "C:\\Data\\2022", "C:\\Archive"}},
+    {"folder", SampleKind::Text, {"C:\\Data", "C:\\Data\\2023", "C:\\Data\\2022", "C:\\Archive"}},
     {"filename", SampleKind::Text, {"Report.txt", "Data.csv", "Export.txt", "List.csv"}},
+    {"file name", SampleKind::Text, {"Report.txt", "Data.csv", "Export.txt", "List.csv"}},
     {"sex", SampleKind::Text, {"F", "M", "F", "M"}},
     {"gender", SampleKind::Text, {"F", "M", "F", "M"}},
     {"dob", SampleKind::Date, {"3/14/2001", "7/2/2003", "11/23/2002", "5/9/2004"}},
@@ -73,10 +83,19 @@ constexpr std::array<Hint, 44> kHints{{
      {"Checked and confirmed", "See attached note", "To be discussed", "Complete"}},
     {"description", SampleKind::Text, {"Standard item", "Second choice", "Special order", "Spare part"}},
     {"note", SampleKind::Text, {"Checked and confirmed", "See attached note", "To be discussed", "Complete"}},
+    {"reason", SampleKind::Text, {"Special order", "Late delivery", "Good conduct", "Correction"}},
+    {"remark",
+     SampleKind::Text,
+     {"Checked and confirmed", "See attached note", "To be discussed", "Complete"}},
+    {"status", SampleKind::Text, {"Active", "Complete", "Active", "Pending"}},
+    {"category", SampleKind::Text, {"Standard", "Special", "Standard", "Other"}},
+    {"product", SampleKind::Text, {"Desk lamp", "Bookshelf", "Garden chair", "Toolbox"}},
+    {"team", SampleKind::Text, {"Red", "Blue", "Green", "Yellow"}},
+    {"currency", SampleKind::Text, {"USD", "EUR", "AUD", "GBP"}},
+    {"percent", SampleKind::Number, {"5", "10", "20", "25"}},
+    {"user", SampleKind::Text, {"amiller", "pbrown", "mgarcia", "jwalker"}},
     {"name", SampleKind::Text, {"Anna Miller", "Peter Brown", "Maria Garcia", "John Walker"}},
 }};
-
-constexpr Words kPlainWords{"First entry", "Second entry", "Third entry", "Fourth entry"};
 
 const Hint* FindHint(std::string_view fieldName) {
     const auto folded = text::FoldCase(fieldName);
@@ -86,11 +105,17 @@ const Hint* FindHint(std::string_view fieldName) {
     return nullptr;
 }
 
-bool LooksLikeNumber(std::string_view fieldName) {
+/// Numbers that count up from record to record.
+bool CountsUp(std::string_view fieldName) {
     const auto folded = text::FoldCase(fieldName);
-    return folded.ends_with("id") || folded.ends_with("no") || folded.ends_with("num") || folded == "pin" ||
-           folded == "age" || folded.find('#') != std::string::npos || folded.ends_with("place") ||
-           folded.ends_with("lane") || folded.ends_with("level") || folded.ends_with("order");
+    for (const auto* ending : {"id", "no", "num", "place", "lane", "level", "order"})
+        if (folded.ends_with(ending))
+            return true;
+    return folded == "pin" || folded.find('#') != std::string::npos;
+}
+
+bool LooksLikeNumber(std::string_view fieldName) {
+    return CountsUp(fieldName) || text::EqualsIgnoringCase(fieldName, "age");
 }
 
 bool Is(std::string_view format, std::string_view name) {
@@ -119,13 +144,19 @@ bool HasSampleWords(std::string_view fieldName) {
     return FindHint(fieldName) != nullptr;
 }
 
+bool SaysItsKind(std::string_view fieldName) {
+    return HasSampleWords(fieldName) || LooksLikeNumber(fieldName);
+}
+
 std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row) {
-    const auto at = static_cast<std::size_t>(row < 0 ? 0 : row) % kPlainWords.size();
+    const auto at = static_cast<std::size_t>(row < 0 ? 0 : row) % std::tuple_size_v<Words>;
     const auto* hint = FindHint(fieldName);
     if (hint != nullptr && hint->kind == kind)
         return std::string(hint->rows[at]);
     switch (kind) {
     case SampleKind::Number: {
+        if (CountsUp(fieldName))
+            return std::to_string(std::max(0, row) + 1);
         static constexpr Words kNumbers{"12", "7", "31", "9"};
         return std::string(Is(format, "Percent") ? "0.25" : kNumbers[at]);
     }
@@ -142,7 +173,7 @@ std::string SampleText(SampleKind kind, std::string_view format, std::string_vie
     case SampleKind::Text:
         break;
     }
-    return std::string(kPlainWords[at]);
+    return {};
 }
 
 } // namespace tovimar::platform::painting

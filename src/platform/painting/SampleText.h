@@ -14,7 +14,11 @@ SampleKind KindOf(std::string_view format, std::string_view fieldName);
 /// Is there sample text that fits a field of that name?
 bool HasSampleWords(std::string_view fieldName);
 
-/// Content of a field in the row `row` (from 0), without its format.
+/// Does the name tell what such a field holds?
+bool SaysItsKind(std::string_view fieldName);
+
+/// Content of a field in the row `row` (from 0), without its format. Empty for a text of which nothing is
+/// known: an empty box is what the host shows for a new record.
 std::string SampleText(SampleKind kind, std::string_view format, std::string_view fieldName, int row);
 
 } // namespace tovimar::platform::painting

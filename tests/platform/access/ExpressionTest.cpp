@@ -95,6 +95,7 @@ TEST(Expressions, ValuesShowInTheirFormats) {
         {Datum::Date(0.5), "", "12:00:00 PM"},
         {Datum::Number(1234.5), "Currency", "$1,234.50"},
         {Datum::Number(-1234.5), "Currency", "($1,234.50)"},
+        {Datum::Number(1234.5), "General Number", "1234.5"},
         {Datum::Number(1234567), "#,##0.00", "1,234,567.00"},
         {Datum::Number(-3), "0;(0);\"none\"", "(3)"},
         {Datum::Number(0.125), "0.#%", "12.5%"},
