@@ -33,22 +33,35 @@ std::int32_t EdgeOf(const CXmlForm& form, const CXmlControl& container) {
 
 using Corners = std::array<std::int32_t, 4>;
 
-Corners CornersInControlPicture(const CXmlForm& form, const CXmlControl& control, const CXmlControl& parent) {
-    const CXmlControl* page = parent.IsTabPage() ? parent.ParentControl() : nullptr;
-    const CXmlControl& reference = page == nullptr ? parent : *page;
-    const std::int32_t edge = EdgeOf(form, reference);
-    const std::int32_t left = SaturatedSum(0, -std::int64_t{reference.HotSpotLeft()});
-    const std::int32_t top = SaturatedSum(edge, -std::int64_t{reference.HotSpotTop()});
-    return {SaturatedSum(control.HotSpotLeft(), left), SaturatedSum(control.HotSpotTop(), top),
-            SaturatedSum(control.HotSpotRight(), left), SaturatedSum(control.HotSpotBottom(), top)};
+Corners CornersOf(const CXmlControl& control) {
+    return {control.HotSpotLeft(), control.HotSpotTop(), control.HotSpotRight(), control.HotSpotBottom()};
 }
 
-/// A subform shows a part of its form only: what its frame cuts is cut, what it hides is left empty.
-Corners WithinFrame(Corners corners, const CXmlControl& subform) {
-    const std::int32_t width = SaturatedSum(subform.HotSpotRight(), -std::int64_t{subform.HotSpotLeft()});
-    const std::int32_t height = SaturatedSum(subform.HotSpotBottom(), -std::int64_t{subform.HotSpotTop()});
-    return {std::max(corners[0], 0), std::max(corners[1], 0), std::min(corners[2], width),
-            std::min(corners[3], height)};
+/// A subform shows a part of its form only: what its frame cuts is cut, what it hides is left empty. Frames
+/// within frames cut all of what they hold. False when nothing is left.
+bool CutByFrames(Corners& corners, const CXmlControl& control) {
+    for (const CXmlControl* up = control.ParentControl(); up != nullptr; up = up->ParentControl()) {
+        if (!up->IsClass("SubForm"))
+            continue;
+        const Corners frame = CornersOf(*up);
+        for (const std::size_t i : {0U, 1U}) {
+            corners[i] = std::max(corners[i], frame[i]);
+            corners[i + 2] = std::min(corners[i + 2], frame[i + 2]);
+        }
+        if (corners[0] >= corners[2] || corners[1] >= corners[3])
+            return false;
+    }
+    return true;
+}
+
+/// From the window's picture to that of a container.
+Corners InControlPicture(const Corners& corners, const CXmlForm& form, const CXmlControl& parent) {
+    const CXmlControl* page = parent.IsTabPage() ? parent.ParentControl() : nullptr;
+    const CXmlControl& reference = page == nullptr ? parent : *page;
+    const std::int32_t left = SaturatedSum(0, -std::int64_t{reference.HotSpotLeft()});
+    const std::int32_t top = SaturatedSum(EdgeOf(form, reference), -std::int64_t{reference.HotSpotTop()});
+    return {SaturatedSum(corners[0], left), SaturatedSum(corners[1], top), SaturatedSum(corners[2], left),
+            SaturatedSum(corners[3], top)};
 }
 
 } // namespace
@@ -60,19 +73,14 @@ std::string TopicSections::AreaName(const CXmlControl& control) const {
 
 void TopicSections::AppendArea(std::string& out, const std::string& prefix, const CXmlControl& control,
                                const CXmlControl* parent, bool ofTab) const {
-    Corners corners;
-    if (ofTab)
+    Corners corners = CornersOf(control);
+    if (ofTab) {
         corners = {control.TabHotSpotLeft(), control.TabHotSpotTop(), control.TabHotSpotRight(),
                    control.TabHotSpotBottom()};
-    else if (parent == nullptr)
-        corners = {control.HotSpotLeft(), control.HotSpotTop(), control.HotSpotRight(),
-                   control.HotSpotBottom()};
-    else
-        corners = CornersInControlPicture(form_, control, *parent);
-    if (!ofTab && parent != nullptr && parent->IsClass("SubForm")) {
-        corners = WithinFrame(corners, *parent);
-        if (corners[0] >= corners[2] || corners[1] >= corners[3])
+    } else if (parent != nullptr) {
+        if (!CutByFrames(corners, control))
             return;
+        corners = InControlPicture(corners, form_, *parent);
     }
     out.append("<AREA SHAPE=\"RECT\" COORDS=\"");
     for (std::size_t i = 0; i < corners.size(); ++i)

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "support/Tags.h"
+
 #include <filesystem>
 #include <map>
 #include <set>
@@ -8,14 +10,6 @@
 
 /// Reads what a run has written as a browser would.
 namespace tovimar::test {
-
-/// A tag with its attributes, names in lower case.
-struct Tag {
-    std::string name;
-    std::map<std::string, std::string> attributes;
-    std::string Attribute(const std::string& attribute) const;
-};
-std::vector<Tag> TagsOf(const std::string& html);
 
 /// Width and height in pixels as the file's frame header says; 0 for a file that isn't JPEG.
 std::pair<int, int> SizeOfJpeg(const std::string& bytes);

@@ -252,12 +252,8 @@ void CN_IDEAccFormProcessor::PlaceInDatasheet(const HostObject& form, const Host
     const auto column = columns.find(late::Text(control, "Name"));
     if (column == columns.end())
         return;
-    const double twipsPerPixel = platform::Env().windows->Metrics().twipsPerPixelX;
-    using platform::access::RoundToEven;
-    rectangle.left =
-        RoundToEven(column->second.left / twipsPerPixel + dimensions_.DatasheetFormRecordSelectorWidth());
-    rectangle.right = rectangle.left + RoundToEven(column->second.width / twipsPerPixel);
-    rectangle.bottom = dimensions_.DatasheetFormTitleHeight();
+    rectangle = platform::access::ColumnRectangle(platform::Env().windows->Metrics(), column->second.left,
+                                                  column->second.width);
 }
 
 void CN_IDEAccFormProcessor::GetTabPageTabRectangleInTwips(std::int32_t vlngTabIdx, const HostObject&,

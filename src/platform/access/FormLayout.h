@@ -77,6 +77,10 @@ int SectionOffsetX(const SectionHeights& heights, int section);
 Rectangle ControlRectangle(const SystemMetrics& metrics, const Frame& frame, int sectionOffset, double left,
                            double top, double width, double height);
 
+/// Head of a datasheet's column, relative to the client area's origin; twips in. Each side is rounded by
+/// itself, so neighbours may share a pixel or leave one between them.
+Rectangle ColumnRectangle(const SystemMetrics& metrics, double left, double width);
+
 /// A tab control's tabs, in one row.
 struct TabInput {
     int controlLeft = 0, controlTop = 0;    ///< as ControlRectangle gave them
@@ -85,6 +89,8 @@ struct TabInput {
     int fontWeight = 400;
     std::vector<std::string> captions; ///< of all pages, names where captions are empty
 };
+/// Of every tab; the pages' frame begins below it.
+int TabHeight(const SystemMetrics& metrics, const TabInput& input);
 /// Rectangle of the tab of page `index` (from 0).
 Rectangle TabRectangle(const SystemMetrics& metrics, const TabInput& input, int index);
 

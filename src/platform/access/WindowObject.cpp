@@ -252,6 +252,16 @@ void WindowObject::WriteInsideHeight(const Value& value) {
     Resize(open_.insideHeight, value, /*horizontal=*/false);
 }
 
+/// A design window doesn't get too small for its surface: tabs and controls may reach beyond the form's
+/// width.
+int WindowObject::LeastSide(bool horizontal) const {
+    if (open_.view != View::Design || nested_)
+        return 0;
+    OpenObject whole = open_;
+    SetInitialSize(whole, Env().windows->Metrics());
+    return horizontal ? whole.insideWidth : whole.insideHeight;
+}
+
 /// The window grows and shrinks with its client area; its frame stays.
 void WindowObject::Resize(int& side, const Value& twips, bool horizontal) {
     constexpr double kMostPixels = 16000;
@@ -259,7 +269,8 @@ void WindowObject::Resize(int& side, const Value& twips, bool horizontal) {
     auto& windows = *Env().windows;
     const auto& metrics = windows.Metrics();
     const double perPixel = horizontal ? metrics.twipsPerPixelX : metrics.twipsPerPixelY;
-    const int pixels = RoundToEven(std::clamp(twips.AsDouble() / perPixel, 0.0, kMostPixels));
+    const int asked = RoundToEven(std::clamp(twips.AsDouble() / perPixel, 0.0, kMostPixels));
+    const int pixels = std::max(asked, LeastSide(horizontal));
     const int growth = pixels - side;
     side = pixels;
     auto* window = windows.Find(open_.window);

@@ -61,6 +61,7 @@ private:
     WindowObject& Outermost() const;
     void Resize(int& side, const Value& twips, bool horizontal);
     std::int32_t WindowSide(bool horizontal) const;
+    int LeastSide(bool horizontal) const;
 
     Value ReadName(const Arguments&);
     Value ReadHandle(const Arguments&);

@@ -106,10 +106,8 @@ void ControlPainter::PaintTab(const Object& control, const Rectangle& area) {
     const int styleNumber = control.Integer("Style", 0);
     const auto ground = place_.ground;
     if (canvas_.Visible(area) && styleNumber != 2) {
-        const int headHeight = control.Integer("TabFixedHeight", 0) == 0
-                                   ? 284 / context_.metrics.twipsPerPixelY
-                                   : control.Integer("TabFixedHeight") / context_.metrics.twipsPerPixelY;
-        const Rectangle body{area.left, area.top + headHeight, area.right, area.bottom};
+        const int heads = access::TabHeight(context_.metrics, TabInputOf(control, area.left, area.top));
+        const Rectangle body{area.left, area.top + heads, area.right, area.bottom};
         if (control.Integer("BackStyle", 1) != 0) {
             canvas_.Fill(body, SystemColor::kFace);
             place_.ground = SystemColor::kFace;

@@ -148,17 +148,15 @@ void ObjectPainter::PaintDatasheet(const Rectangle& area) {
     double twips = 0;
     for (const auto* column : access::DatasheetColumns(design)) {
         const int width = access::DatasheetColumnWidth(*column);
-        const int left =
-            access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
+        const auto place = Moved(access::ColumnRectangle(metrics, twips, width), inner.left, inner.top);
         twips += width;
-        const int right =
-            access::RoundToEven(twips / metrics.twipsPerPixelX) + inner.left + metrics.scrollWidth;
-        if (width > 0 && left < inner.right)
-            columns.push_back({column, {left, inner.top, right, inner.top + metrics.captionHeight}});
+        if (width > 0 && place.left < inner.right)
+            columns.push_back({column, place});
     }
     const ClipTo clip(canvas_, inner);
-    for (const auto& column : columns)
-        PaintColumnHead(canvas_, column.place, ColumnTitle(*column.object));
+    // From the right, as a column keeps its line where the next one begins on it.
+    for (auto column = columns.rbegin(); column != columns.rend(); ++column)
+        PaintColumnHead(canvas_, column->place, ColumnTitle(*column->object));
     const int known = sample_.RecordCount();
     const int right = columns.empty() ? inner.left + metrics.scrollWidth : columns.back().place.right;
     PaintRows(canvas_, metrics, inner, right, known < 0 ? 8 : known, [&](int row, int top) {

@@ -111,6 +111,19 @@ Rectangle ControlRectangle(const SystemMetrics& metrics, const Frame& frame, int
     return result;
 }
 
+Rectangle ColumnRectangle(const SystemMetrics& metrics, double left, double width) {
+    Rectangle result;
+    result.left = RoundToEven(left / metrics.twipsPerPixelX + metrics.scrollWidth);
+    result.right = result.left + RoundToEven(width / metrics.twipsPerPixelX);
+    result.bottom = metrics.captionHeight;
+    return result;
+}
+
+int TabHeight(const SystemMetrics& metrics, const TabInput& input) {
+    const double twips = input.fixedHeight == 0 ? kNaturalTabHeight : input.fixedHeight;
+    return RoundToEven(twips / metrics.twipsPerPixelY);
+}
+
 Rectangle TabRectangle(const SystemMetrics& metrics, const TabInput& input, int index) {
     if (index < 0 || static_cast<std::size_t>(index) >= input.captions.size())
         return {};
@@ -123,12 +136,11 @@ Rectangle TabRectangle(const SystemMetrics& metrics, const TabInput& input, int 
             left += NaturalTabWidth(metrics, input, static_cast<std::size_t>(i));
         width = NaturalTabWidth(metrics, input, static_cast<std::size_t>(index));
     }
-    const double height = input.fixedHeight == 0 ? kNaturalTabHeight : input.fixedHeight;
     Rectangle result;
     result.left = RoundToEven(left);
     result.top = input.controlTop;
     result.right = result.left + RoundToEven(width);
-    result.bottom = result.top + RoundToEven(height / metrics.twipsPerPixelY);
+    result.bottom = result.top + TabHeight(metrics, input);
     return result;
 }
 

@@ -58,6 +58,22 @@ bool HasRecords(const Design& design) {
     return !design.root->Text("RecordSource").empty() || (detail != nullptr && IsBound(*detail));
 }
 
+/// Does a shown control below `parent` reach into that part of the client area? Text and drawings may be
+/// covered.
+bool Reaches(const DesignObject& parent, const SystemMetrics& metrics, const access::Frame& frame, int offset,
+             const Rectangle& part) {
+    return std::any_of(parent.children.begin(), parent.children.end(), [&](const auto& control) {
+        if (control->Is("Label") || control->Is("Line") || control->Is("Rectangle") ||
+            !control->Flag("Visible"))
+            return false;
+        const auto place = access::ControlRectangle(metrics, frame, offset, control->Integer("Left"),
+                                                    control->Integer("Top"), control->Integer("Width"),
+                                                    control->Integer("Height"));
+        return place.left < part.right && place.right > part.left && place.top < part.bottom &&
+               place.bottom > part.top;
+    });
+}
+
 std::string GroupField(const Design& design, int level) {
     int at = 0;
     for (const auto& child : design.root->children)
@@ -124,6 +140,27 @@ int ShownRecordsOf(const Design& design, View view, int insideHeight, const Syst
         if (section.number != 0 && section.number <= 4 && IsSectionShown(design, section, view))
             around += PixelsOf(*section.object, "Height", metrics.twipsPerPixelY);
     return std::clamp((insideHeight - around) / detail, 1, kMostRecords);
+}
+
+FormBars FormBarsOf(const Design& design, View view, int insideWidth, int insideHeight,
+                    const SystemMetrics& metrics) {
+    constexpr int kLeastWidth = 60;
+    const int kind = design.root->Integer("ScrollBars", 3);
+    FormBars bars{0, NavigationHeight(design, metrics)};
+    if (IsContinuous(design, view) && (kind == 2 || kind == 3) && insideWidth > kLeastWidth)
+        bars.scroll = metrics.scrollWidth;
+    const auto frame = access::ComputeFrame(metrics, FrameSettingsOf(design, view));
+    const auto heights =
+        HeightsOf(design, view, ShownRecordsOf(design, view, insideHeight, metrics), metrics);
+    const Rectangle right{insideWidth - bars.scroll, 0, insideWidth, insideHeight};
+    const Rectangle foot{0, insideHeight - bars.navigation, insideWidth, insideHeight};
+    for (const auto& section : PlacedSections(design, view, heights, frame.sectionBarHeight)) {
+        if (Reaches(*section.object, metrics, frame, section.offset, right))
+            bars.scroll = 0;
+        if (Reaches(*section.object, metrics, frame, section.offset, foot))
+            bars.navigation = 0;
+    }
+    return bars;
 }
 
 SectionHeights HeightsOf(const Design& design, View view, int records, const SystemMetrics& metrics) {

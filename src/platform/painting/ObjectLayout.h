@@ -39,6 +39,15 @@ std::string SectionTitle(const access::Design& design, int number);
 int PixelsOf(const access::DesignObject& object, std::string_view property, int twipsPerPixel);
 /// Height of a form's navigation buttons with their line, 0 without them.
 int NavigationHeight(const access::Design& design, const SystemMetrics& metrics);
+/// Width of a form's vertical scroll bar at the right of its client area and height of its navigation buttons
+/// at the foot, 0 without them. A frame that leaves them no room goes without, as they must not cover a
+/// control.
+struct FormBars {
+    int scroll = 0;
+    int navigation = 0;
+};
+FormBars FormBarsOf(const access::Design& design, access::View view, int insideWidth, int insideHeight,
+                    const SystemMetrics& metrics);
 /// Height of a record of a datasheet.
 inline constexpr int kDatasheetRow = 18;
 

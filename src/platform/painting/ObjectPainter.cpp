@@ -57,15 +57,11 @@ void ObjectPainter::PaintFormBackground(const Rectangle& area) {
 void ObjectPainter::PaintForm(const Rectangle& area) {
     const auto& design = context_.design;
     PaintFormBackground(area);
-    Rectangle inner = area;
-    const int navigation = NavigationHeight(design, context_.metrics);
-    inner.bottom -= navigation;
-    const int bars = design.root->Integer("ScrollBars", 3);
-    if (IsContinuous(design, context_.view) && (bars == 2 || bars == 3) && inner.Width() > 60) {
-        inner.right -= context_.metrics.scrollWidth;
+    const auto bars = FormBarsOf(design, context_.view, area.Width(), area.Height(), context_.metrics);
+    const Rectangle inner{area.left, area.top, area.right - bars.scroll, area.bottom - bars.navigation};
+    if (bars.scroll > 0)
         PaintScrollBar(canvas_, {inner.right, inner.top, area.right, inner.bottom}, true);
-    }
-    if (navigation > 0)
+    if (bars.navigation > 0)
         PaintNavigationBar(canvas_, {area.left, inner.bottom, area.right, area.bottom},
                            sample_.RecordCount());
 
@@ -90,8 +86,7 @@ void ObjectPainter::PaintRecords(const PlacedSection& section, const Rectangle& 
     // A record cut off at the foot of the window shows its head.
     const int shown = continuous && last && records > 1 ? records + 1 : records;
     const int known = sample_.RecordCount();
-    constexpr int kSampleRecords = 4;
-    const int filled = known < 0 ? std::min(shown, kSampleRecords) : std::max(1, known);
+    const int filled = known < 0 ? shown : std::max(1, known);
     for (int row = 0; row < shown; ++row) {
         const auto edge = [&](int at) {
             return area.top + section.offset +
@@ -134,9 +129,10 @@ void ObjectPainter::PaintDesign(const Rectangle& area) {
         const auto ground = GroundOf(*section.object, false);
         canvas_.Fill(place, ground);
         PaintGrid(place, ground);
+        // Below the controls: one that reaches beyond the surface is whole all the same.
+        canvas_.Fill({place.right, place.top, place.right + 1, place.bottom}, SystemColor::kDarkShadow);
         PaintControls(*section.object, area.left, content, {area.left, content, area.right, place.bottom}, 0,
                       ground);
-        canvas_.Fill({place.right, place.top, place.right + 1, place.bottom}, SystemColor::kDarkShadow);
     }
 }
 

@@ -1,4 +1,5 @@
 #include "platform/painting/PaintingTest.h"
+#include "support/Boxes.h"
 
 #include <filesystem>
 #include <fstream>
@@ -25,10 +26,7 @@ public:
                 BoxChildren(*section);
     }
 
-    static std::uint32_t ColorOf(const DesignObject& box) {
-        const auto ole = static_cast<std::uint32_t>(box.Integer("BackColor"));
-        return (ole & 0xFFU) << 16U | (ole & 0xFF00U) | (ole >> 16U & 0xFFU);
-    }
+    static std::uint32_t ColorOf(const DesignObject& box) { return BoxColor(box.Integer("Number")); }
 
 private:
     void BoxChildren(DesignObject& parent) {
@@ -46,8 +44,8 @@ private:
         for (const auto* property : {"Left", "Top", "Width", "Height"})
             Set(*box, property, control->Integer(property));
         Set(*box, "OldBorderStyle", 0);
-        // Far from the colours of frames, bars and grounds.
-        Set(*box, "BackColor", 0x200000 + 3 * ++made_);
+        Set(*box, "Number", ++made_);
+        Set(*box, "BackColor", BoxOleColor(made_));
         if (control->Is("Tab") && !control->children.empty())
             box->children = std::move(control->children.front()->children);
         else if (!control->Is("Tab"))
