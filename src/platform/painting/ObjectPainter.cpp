@@ -86,7 +86,8 @@ void ObjectPainter::PaintRecords(const PlacedSection& section, const Rectangle& 
     // A record cut off at the foot of the window shows its head.
     const int shown = continuous && last && records > 1 ? records + 1 : records;
     const int known = sample_.RecordCount();
-    const int filled = known < 0 ? shown : std::max(1, known);
+    constexpr int kSampleRecords = 4;
+    const int filled = known < 0 ? std::min(shown, kSampleRecords) : std::max(1, known);
     for (int row = 0; row < shown; ++row) {
         const auto edge = [&](int at) {
             return area.top + section.offset +
