@@ -87,9 +87,16 @@ RawXmlWalk::Elements RawXmlWalk::Pages(const HostObject& control, const std::str
                                        std::int32_t level) {
     Elements elements;
     const std::int32_t pages = processor_.TabControlPagesQtyGet(control);
+    std::int32_t first = 0;
     for (std::int32_t i = 0; i < pages; ++i)
-        if (const HostObject page = processor_.TabPageActivate(form_, control, i))
+        if (const HostObject page = processor_.TabPageActivate(form_, control, i)) {
+            if (elements.empty())
+                first = i;
             elements.push_back(PageXml(control, page, name, i, level + 1));
+        }
+    // Where page 0 is hidden the picture shows the first page that the map tells of.
+    if (first > 0)
+        processor_.TabPageActivate(form_, control, first);
     return elements;
 }
 

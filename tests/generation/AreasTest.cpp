@@ -221,6 +221,16 @@ TEST_P(DesignAreasTest, OfTabsInRowsOfFixedAndNaturalWidth) {
     ExpectAreasOfAll();
 }
 
+TEST_P(DesignAreasTest, OfTabsWithHiddenPages) {
+    const std::string hidden =
+        Block("Page", "Visible = NotDefault\nCaption =\"Hidden\"\n", TextBox(202, 1900));
+    const std::string place = Placed(97, 68, 5203, 2993);
+    Add("First", Form({}, Block("Tab", place, hidden + Pages(2, "P"))));
+    Add("Second", Form({}, Block("Tab", place, Pages(1, "P") + hidden + Pages(1, "Q"))));
+    Add("Last", Form({}, Block("Tab", place, Pages(2, "P") + hidden)));
+    ExpectAreasOfAll();
+}
+
 TEST_P(DesignAreasTest, OfFramesWithinFrames) {
     const std::string group =
         Block("OptionGroup", Placed(203, 307, 1407, 802), Block("OptionButton", Placed(301, 400, 260, 240)));

@@ -135,7 +135,7 @@ void BoxedExports::WriteControl(const DesignObject& control, Box box) {
     Line("BorderWidth", "0");
     Line("OldBorderStyle", frame ? "1" : "0");
     Line("BackStyle", untold ? "0" : "1");
-    Line("Visible", "-1");
+    Line("Visible", control.Is("Page") && !control.Flag("Visible") ? "0" : "-1");
     for (const char* part : {"Back", "Fore", "Border"}) {
         Line(std::string(part) + "ThemeColorIndex", "-1");
         // A tab's caption is written outside the boxes.
