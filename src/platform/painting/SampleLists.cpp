@@ -7,7 +7,6 @@
 /// What lists and combo boxes offer and show.
 namespace tovimar::platform::painting {
 
-using access::Datum;
 using access::DesignObject;
 using access::Records;
 

@@ -289,7 +289,7 @@ private:
 
     std::unordered_map<std::string, LaidText> texts_;
     std::unordered_map<std::string, LaidText> former_; ///< asked for before the present ones
-    LaidText long_; ///< the last long one
+    LaidText long_;                                    ///< the last long one
 };
 
 void Show(Canvas& canvas, PangoLayout* layout, Color color, int left, int top, double scale) {

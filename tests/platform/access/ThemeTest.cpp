@@ -12,8 +12,8 @@ namespace {
 
 std::string Number(std::size_t value, int size) {
     std::string bytes;
-    for (int i = 0; i < size; ++i)
-        bytes += static_cast<char>(value >> (8 * i) & 0xFFU);
+    for (int i = 0; i < size; ++i, value >>= 8U)
+        bytes += static_cast<char>(value & 0xFFU);
     return bytes;
 }
 
