@@ -3,6 +3,7 @@
 #include "foundation/CAddInProjects.h"
 #include "foundation/CTraceLog.h"
 #include "foundation/CXmlMessages.h"
+#include "foundation/LoadedForms.h"
 
 namespace tovimar {
 namespace {
@@ -21,6 +22,7 @@ struct State {
     CTraceLog* traceLog = nullptr;
     CXmlMessages* messages = nullptr;
     CAddInSettingsXmlFile* settings = nullptr;
+    LoadedForms forms;
     // They serve while nobody has set any.
     CTraceLog ownTraceLog;
     CXmlMessages noMessages;
@@ -130,6 +132,10 @@ CXmlMessages* Messages() {
 
 void SetMessages(CXmlMessages* messages) {
     TheState().messages = messages;
+}
+
+LoadedForms& Forms() {
+    return TheState().forms;
 }
 
 CAddInSettingsXmlFile* Settings() {

@@ -19,6 +19,7 @@ class CTraceLog;
 class CXmlMessages;
 class CCodePages;
 class CAddInSettingsXmlFile;
+class LoadedForms;
 
 /// What the foundation asks of the run above it. The server data implements it and registers itself;
 /// without a run the session answers with these defaults.
@@ -80,6 +81,8 @@ void SetTraceLog(CTraceLog* log);
 /// Never null: an empty table serves while none is loaded.
 CXmlMessages* Messages();
 void SetMessages(CXmlMessages* messages);
+/// The forms of the process that are loaded.
+LoadedForms& Forms();
 CAddInSettingsXmlFile* Settings();
 void SetSettings(CAddInSettingsXmlFile* settings);
 

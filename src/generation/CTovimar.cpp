@@ -160,7 +160,7 @@ void CTovimar::CompleteGeneration(RunPaths& paths, bool vfSaveChanges, bool vfOp
     step = 4;
     if (vfOpenHelp && FileExists(paths.compiledFile)) {
         RunData().ProgressBarUpdate("Opening generated and compiled HTML help...", 3);
-        clsHtmlHelp::OpenTOC(paths.compiledFile, 0);
+        RunData().HtmlHelp().OpenTOC(paths.compiledFile, 0);
     }
     if (parameters_->OpenHTMLEditor)
         OpenEditor();

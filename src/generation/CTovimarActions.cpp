@@ -271,7 +271,7 @@ void CTovimarActions::LoadTree() {
         settings->CopyToOptions();
     if (root->HtmlTitle().empty())
         root->SetHtmlTitle(parameters.HelpProjectTitle());
-    clsHtmlHelp::CloseAll();
+    RunData().HtmlHelp().CloseAll();
     HostAgent().HourglassOn();
     HostAgent().HideIDEWindows();
     platform::Env().doEvents();

@@ -88,6 +88,26 @@ bool TestFolderWritable(const std::string& vstrFolder) {
     }
 }
 
+std::int32_t ShellExecute(const std::string& file, const std::string& /*verb*/, const std::string& parameters,
+                          bool vfWait) {
+    constexpr std::int32_t kDone = 42;
+    constexpr std::int32_t kNoProgram = 31;
+    if (!vfWait && parameters.empty())
+        return platform::Env().processes->Open(file) ? kDone : kNoProgram;
+    const ResultCode result =
+        ShellAndWait("\"" + file + "\"" + (parameters.empty() ? "" : " " + parameters), 1);
+    return result == kSuccess ? kDone : result;
+}
+
+ResultCode ShellAndWait(const std::string& command, std::int32_t /*windowStyle*/) {
+    try {
+        platform::Env().processes->RunAndWait(command);
+        return kSuccess;
+    } catch (const RaisedError& failure) {
+        return failure.Number();
+    }
+}
+
 void WarningDialog(const std::string& vstrText) {
     ShowMessage(vstrText, kMsgExclamation, kApplicationTitle, {}, 0, "modTovimarUtils.WarningDialog");
 }

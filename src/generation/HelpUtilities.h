@@ -1,5 +1,8 @@
 #pragma once
 
+#include "platform/Error.h"
+
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -23,6 +26,14 @@ bool TestFolderWritable(const std::string& vstrFolder);
 
 /// Folder of the help compiler hhc.exe with a trailing backslash; empty when it isn't installed.
 std::string GetHtmlHelpWorkshopExePath();
+
+/// Opens a file or folder with its program for "open", or runs a program when parameters or waiting are asked
+/// for. Above 32 for success, as the platform has it; else 31, or the failure of the start.
+std::int32_t ShellExecute(const std::string& file, const std::string& verb, const std::string& parameters,
+                          bool vfWait);
+/// Runs a command line and waits for its end without limit. 0, or the failure of the start; the window style
+/// is the platform's to heed.
+ResultCode ShellAndWait(const std::string& command, std::int32_t windowStyle);
 
 /// A warning with the exclamation icon, title "Tovimar Add-In".
 void WarningDialog(const std::string& vstrText);

@@ -66,16 +66,19 @@ void TraceTimestamp(const char* text) {
     TraceText([text] { return LongDateAndTime() + ": Timestamp - " + text; });
 }
 
-std::string LongDateAndTime() {
+std::string LongDateAndTime(const platform::DateTime& time) {
     constexpr std::array<const char*, 12> kMonths{"January",   "February", "March",    "April",
                                                   "May",       "June",     "July",     "August",
                                                   "September", "October",  "November", "December"};
-    const platform::DateTime now = platform::Env().clock->Now();
     std::array<char, 64> buffer{};
     std::snprintf(buffer.data(), buffer.size(), "%s %d, %d %02d:%02d:%02d",
-                  kMonths.at(static_cast<std::size_t>(now.month - 1)), now.day, now.year, now.hour,
-                  now.minute, now.second);
+                  kMonths.at(static_cast<std::size_t>(time.month - 1)), time.day, time.year, time.hour,
+                  time.minute, time.second);
     return buffer.data();
+}
+
+std::string LongDateAndTime() {
+    return LongDateAndTime(platform::Env().clock->Now());
 }
 
 } // namespace tovimar

@@ -8,6 +8,9 @@
 /// and the time stamps of the trace log.
 namespace tovimar {
 
+namespace platform {
+struct DateTime;
+}
 class CTovimarServerAgent;
 class CTovimarServerData;
 
@@ -49,6 +52,8 @@ void TraceText(const std::function<std::string()>& text);
 /// "<now>: Timestamp - " and the text.
 void TraceTimestamp(const char* text);
 /// Date and time in the clock's long form: "November 22, 2026 23:29:32".
+std::string LongDateAndTime(const platform::DateTime& time);
+/// Of now.
 std::string LongDateAndTime();
 
 } // namespace tovimar

@@ -29,16 +29,9 @@ public:
     DateTime Now() override {
         timespec now{};
         clock_gettime(CLOCK_REALTIME, &now);
-        std::tm local{};
-        localtime_r(&now.tv_sec, &local);
-        const double seconds = local.tm_hour * 3600 + local.tm_min * 60 + local.tm_sec;
-        return {local.tm_year + 1900,
-                local.tm_mon + 1,
-                local.tm_mday,
-                local.tm_hour,
-                local.tm_min,
-                local.tm_sec,
-                seconds + static_cast<double>(now.tv_nsec) / 1e9};
+        DateTime local = LocalTime(now.tv_sec);
+        local.secondsSinceMidnight += static_cast<double>(now.tv_nsec) / 1e9;
+        return local;
     }
     double Timer() override { return Now().secondsSinceMidnight; }
 };
@@ -76,7 +69,12 @@ public:
     std::int32_t Show(std::int32_t, const std::string&, std::uint32_t, const std::string&) override {
         return 0;
     }
-    void CloseAll() override {}
+};
+
+class NoTimers : public Timers {
+public:
+    std::int32_t Start(std::int32_t, std::function<void()>) override { return 1; }
+    void Stop(std::int32_t) override {}
 };
 
 std::string Variable(const char* name) {
@@ -140,6 +138,19 @@ Environment::~Environment() = default;
 Environment::Environment(Environment&&) noexcept = default;
 Environment& Environment::operator=(Environment&&) noexcept = default;
 
+DateTime LocalTime(std::int64_t secondsSince1970) {
+    const auto seconds = static_cast<std::time_t>(secondsSince1970);
+    std::tm local{};
+    localtime_r(&seconds, &local);
+    return {local.tm_year + 1900,
+            local.tm_mon + 1,
+            local.tm_mday,
+            local.tm_hour,
+            local.tm_min,
+            local.tm_sec,
+            static_cast<double>(local.tm_hour * 3600 + local.tm_min * 60 + local.tm_sec)};
+}
+
 Environment& Env() {
     if (!InForce())
         throw RaisedError(kGeneralFailure, "No environment is in force", "Environment");
@@ -167,6 +178,7 @@ std::unique_ptr<Environment> MakeRealEnvironment(const RealEnvironmentOptions& o
     environment->progressWindow = std::make_unique<NoProgress>();
     environment->helpViewer = std::make_unique<NoHelpViewer>();
     environment->windows = std::make_unique<WindowSystem>();
+    environment->timers = std::make_unique<NoTimers>();
     environment->folders = MakeFolders(*environment->files, options.programFolder);
     environment->userName = UserName();
     environment->languageId = LanguageId();

@@ -37,12 +37,14 @@ public:
     virtual void DeleteFile(const std::string& path) = 0;
     /// Raises 58 "File already exists" when the target stands.
     virtual void RenameFile(const std::string& from, const std::string& to) = 0;
-    /// Replaces an existing target.
+    /// Replaces an existing target; the copy gets the time of the original.
     virtual void CopyFile(const std::string& from, const std::string& to) = 0;
     /// Makes the folder with all its missing parents; an existing folder is no failure.
     virtual void MakeFolders(const std::string& path) = 0;
     virtual std::uint64_t FileLength(const std::string& path) = 0;
     virtual bool IsReadOnly(const std::string& path) = 0;
+    /// When the file was last written, in whole seconds since 1970.
+    virtual std::int64_t FileTime(const std::string& path) = 0;
     /// File names (no folders) that match the pattern ("*.htm", "*.*"), sorted without regard to case.
     virtual std::vector<std::string> ListFiles(const std::string& folder, const std::string& pattern) = 0;
     virtual std::vector<std::string> ListFolders(const std::string& folder) = 0;
@@ -86,6 +88,9 @@ struct DateTime {
     double secondsSinceMidnight = 0;
 };
 
+/// Local time of whole seconds since 1970.
+DateTime LocalTime(std::int64_t secondsSince1970);
+
 class Clock {
 public:
     virtual ~Clock() = default;
@@ -125,7 +130,20 @@ public:
     /// The window's number, 0 when none opened.
     virtual std::int32_t Show(std::int32_t callerWindow, const std::string& helpFile, std::uint32_t command,
                               const std::string& data) = 0;
-    virtual void CloseAll() = 0;
+    /// Keeps a window that `Show` gave above all others, without moving or activating it.
+    virtual void MakeTopmost(std::int32_t /*window*/) {}
+    virtual bool IsOpen(std::int32_t /*window*/) { return false; }
+    virtual void Close(std::int32_t /*window*/) {}
+};
+
+/// One-shot timers of the thread that shows windows: a program with a message loop puts its own in.
+class Timers {
+public:
+    virtual ~Timers() = default;
+    /// Calls `tick` once, when the milliseconds are over. The timer's number, never 0.
+    virtual std::int32_t Start(std::int32_t milliseconds, std::function<void()> tick) = 0;
+    /// A timer that is over or unknown does nothing.
+    virtual void Stop(std::int32_t timer) = 0;
 };
 
 /// Known folders, as Windows paths with a trailing backslash.
@@ -153,6 +171,7 @@ struct Environment {
     std::unique_ptr<ProgressView> progressWindow;
     std::unique_ptr<HelpViewer> helpViewer;
     std::unique_ptr<WindowSystem> windows;
+    std::unique_ptr<Timers> timers;
     KnownFolders folders;
     std::string userName;
     /// Lets pending work of the surroundings run: Ctrl+C, window events. Called at the points where the
@@ -180,7 +199,7 @@ struct RealEnvironmentOptions {
     std::string programFolder; ///< native; the folder of the running program
 };
 /// Files on the disk, registry in an ini file, real processes and clock; message boxes answer by their
-/// default button, progress and help viewer do nothing: the program puts in its own.
+/// default button, progress and help viewer do nothing, timers never end: the program puts in its own.
 std::unique_ptr<Environment> MakeRealEnvironment(const RealEnvironmentOptions& options = {});
 
 } // namespace tovimar::platform

@@ -11,6 +11,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
+#include <utility>
 
 namespace tovimar::test {
 namespace fs = std::filesystem;
@@ -90,7 +91,26 @@ bool FakeProcesses::Open(const std::string& pathOrAddress) {
 std::int32_t FakeHelpViewer::Show(std::int32_t, const std::string& helpFile, std::uint32_t command,
                                   const std::string& data) {
     calls.push_back(std::to_string(command) + " " + helpFile + " " + data);
-    return 1;
+    if (!canShow)
+        return 0;
+    open.insert(++last_);
+    return last_;
+}
+
+void FakeHelpViewer::Close(std::int32_t window) {
+    calls.push_back("close " + std::to_string(window));
+    open.erase(window);
+}
+
+std::int32_t FakeTimers::Start(std::int32_t milliseconds, std::function<void()> tick) {
+    lastInterval = milliseconds;
+    running_[++last_] = std::move(tick);
+    return last_;
+}
+
+void FakeTimers::Fire() {
+    for (const auto& [timer, tick] : std::exchange(running_, {}))
+        tick();
 }
 
 EnvironmentTest::EnvironmentTest() : nativeFolder_(MakeTemporaryFolder()) {
@@ -105,6 +125,7 @@ EnvironmentTest::EnvironmentTest() : nativeFolder_(MakeTemporaryFolder()) {
     progress = Place<RecordedProgress>(environment->progressWindow);
     processes = Place<FakeProcesses>(environment->processes);
     viewer = Place<FakeHelpViewer>(environment->helpViewer);
+    timers = Place<FakeTimers>(environment->timers);
     environment->userName = "tester";
     environment->languageId = 1033;
     folder_ = platform::WithTrailingBackslash(environment->files->FromNative(nativeFolder_));

@@ -6,6 +6,8 @@
 
 #include <deque>
 #include <functional>
+#include <map>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -68,14 +70,37 @@ public:
     bool canOpen = true;
 };
 
-/// Calls "<command> <help file> <data>".
+/// Calls "<command> <help file> <data>", "top <window>", "close <window>". Windows are numbered from 1.
 class FakeHelpViewer : public platform::HelpViewer {
 public:
     std::int32_t Show(std::int32_t callerWindow, const std::string& helpFile, std::uint32_t command,
                       const std::string& data) override;
-    void CloseAll() override { calls.push_back("close"); }
+    void MakeTopmost(std::int32_t window) override { calls.push_back("top " + std::to_string(window)); }
+    bool IsOpen(std::int32_t window) override { return open.count(window) != 0; }
+    void Close(std::int32_t window) override;
 
     std::vector<std::string> calls;
+    std::set<std::int32_t> open;
+    bool canShow = true;
+
+private:
+    std::int32_t last_ = 0;
+};
+
+/// Timers that a test lets end by hand.
+class FakeTimers : public platform::Timers {
+public:
+    std::int32_t Start(std::int32_t milliseconds, std::function<void()> tick) override;
+    void Stop(std::int32_t timer) override { running_.erase(timer); }
+    /// Ends every timer that runs now.
+    void Fire();
+    std::size_t Running() const { return running_.size(); }
+
+    std::int32_t lastInterval = 0;
+
+private:
+    std::map<std::int32_t, std::function<void()>> running_;
+    std::int32_t last_ = 0;
 };
 
 /// Base of tests that touch the surroundings: real files in a fresh folder, everything else faked. The
@@ -104,6 +129,7 @@ protected:
     RecordedProgress* progress = nullptr;
     FakeProcesses* processes = nullptr;
     FakeHelpViewer* viewer = nullptr;
+    FakeTimers* timers = nullptr;
     platform::Environment* environment = nullptr;
 
 private:

@@ -14,6 +14,7 @@
 #include "generation/CTovimarParameters.h"
 #include "generation/CTovimarStats.h"
 #include "generation/RunProgress.h"
+#include "generation/clsHtmlHelp.h"
 #include "host/server/CTovimarServerAgent.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
@@ -54,6 +55,7 @@ void CTovimarServerData::Release() {
     if (!traceLog_)
         return;
     SetUnattendedMessages(false, nullptr);
+    htmlHelp_.reset();
     ReleaseStep("mobjTovimar", [this] {
         if (generator_)
             generator_->Terminate();
@@ -85,6 +87,12 @@ CTovimarStats& CTovimarServerData::GenerationStats() {
 
 CTraceLog& CTovimarServerData::TraceLog() {
     return *Session::TraceLog();
+}
+
+clsHtmlHelp& CTovimarServerData::HtmlHelp() {
+    if (!htmlHelp_)
+        htmlHelp_ = std::make_unique<clsHtmlHelp>();
+    return *htmlHelp_;
 }
 
 CTovimar& CTovimarServerData::Generator() {

@@ -11,6 +11,7 @@
 namespace tovimar {
 
 class CTovimarStats;
+class clsHtmlHelp;
 
 /// What the parts of a run share: generator, settings, catalogue, messages, trace log, run state and the
 /// system's own progress window. The session's accessors answer from here while a server is connected.
@@ -33,6 +34,8 @@ public:
     CAddInSettingsXmlFile* Settings() const { return settings_.get(); }
     CXmlMessages* Messages() const { return messages_.get(); }
     CTraceLog& TraceLog();
+    /// Made at the first call.
+    clsHtmlHelp& HtmlHelp();
 
     bool GenerationInterrupted() const;
     void SetGenerationInterrupted(bool vfInterrupted);
@@ -82,6 +85,7 @@ private:
     std::unique_ptr<CAddInSettingsXmlFile> settings_;
     std::unique_ptr<CTraceLog> traceLog_;
     std::unique_ptr<CXmlMessages> messages_;
+    std::unique_ptr<clsHtmlHelp> htmlHelp_;
     std::int32_t hostAppMainWindowHWnd_ = 0;
     std::string lastProgressText_;
     std::int32_t progressValue_ = 0;

@@ -6,6 +6,7 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <array>
 #include <cerrno>
 #include <cstdio>
 #include <fcntl.h>
@@ -174,7 +175,12 @@ void DiskFileSystem::CopyFile(const std::string& from, const std::string& to) {
     if (source == target)
         return;
     RaiseIfReadOnly(target);
-    ReplaceFile(target, NativeFile(source, O_RDONLY).ReadAll());
+    const NativeFile file(source, O_RDONLY);
+    const struct stat info = file.Info();
+    ReplaceFile(target, file.ReadAll());
+    // A copy is as old as what it is a copy of.
+    const std::array<timespec, 2> times{info.st_atim, info.st_mtim};
+    utimensat(AT_FDCWD, target.c_str(), times.data(), 0);
     NoteEntry(target, true);
 }
 
@@ -203,6 +209,14 @@ bool DiskFileSystem::IsReadOnly(const std::string& path) {
     struct stat info {};
     return KindOf(native, &info) == Kind::File &&
            ((info.st_mode & S_IWUSR) == 0 || access(native.c_str(), W_OK) != 0);
+}
+
+std::int64_t DiskFileSystem::FileTime(const std::string& path) {
+    const std::string native = Resolve(path);
+    struct stat info {};
+    if (KindOf(native, &info) != Kind::File)
+        RaiseFileFailure(ENOENT, native);
+    return info.st_mtime;
 }
 
 std::vector<std::string> DiskFileSystem::ListFiles(const std::string& folder, const std::string& pattern) {

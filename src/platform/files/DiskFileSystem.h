@@ -27,6 +27,7 @@ public:
     void MakeFolders(const std::string& path) override;
     std::uint64_t FileLength(const std::string& path) override;
     bool IsReadOnly(const std::string& path) override;
+    std::int64_t FileTime(const std::string& path) override;
     std::vector<std::string> ListFiles(const std::string& folder, const std::string& pattern) override;
     std::vector<std::string> ListFolders(const std::string& folder) override;
     std::string ToNative(const std::string& path) override;
