@@ -110,6 +110,8 @@ void AccessSession::Close(ObjectKind kind, const std::string& name) {
         Env().windows->Close(object->Opened().window);
     object->MarkClosed();
     std::erase(open_, object);
+    if (open_.empty())
+        model_->TrimDesigns();
 }
 
 std::shared_ptr<WindowObject> AccessSession::Active(ObjectKind kind) const {

@@ -25,6 +25,21 @@ std::size_t IndexOf(ObjectKind kind) {
     return static_cast<std::size_t>(kind);
 }
 
+/// A read design takes about ten times its text.
+constexpr std::size_t kKeptDesignBytes = 8U << 20U;
+
+template <typename Visit> void ForEachNamed(const DesignObject& root, const Visit& visit) {
+    std::vector<const DesignObject*> open{&root};
+    while (!open.empty()) {
+        const DesignObject& object = *open.back();
+        open.pop_back();
+        if (!object.name.empty())
+            visit(object);
+        for (const auto& child : object.children)
+            open.push_back(child.get());
+    }
+}
+
 const char* KindWord(ObjectKind kind) {
     switch (kind) {
     case ObjectKind::Form:
@@ -107,10 +122,17 @@ bool ApplicationModel::Contains(ObjectKind kind, const std::string& name) const 
 }
 
 std::string ApplicationModel::NameOf(ObjectKind kind, const std::string& name) const {
-    for (const auto& known : Names(kind))
-        if (text::EqualsIgnoringCase(known, name))
-            return known;
-    return name;
+    auto& self = const_cast<ApplicationModel&>(*this);
+    if (kind == ObjectKind::Table) {
+        const auto* table = tables_.Find(name);
+        return table ? (*table)->definition.name : name;
+    }
+    if (kind == ObjectKind::Query) {
+        const auto* query = queries_.Find(name);
+        return query ? (*query)->definition.name : name;
+    }
+    const auto* object = self.ListOf(kind).Find(name);
+    return object ? (*object)->name : name;
 }
 
 ApplicationModel::Object& ApplicationModel::Demand(ObjectKind kind, const std::string& name) {
@@ -132,12 +154,48 @@ void ApplicationModel::Load(ObjectKind kind, Object& object) {
         return;
     }
     try {
-        object.design = ReadDesign(ReadText(object.path), kind, object.name, Native(object.path));
+        const std::string exported = ReadText(object.path);
+        object.design = ReadDesign(exported, kind, object.name, Native(object.path));
         if (!object.codePath.empty())
             object.design->code = ReadText(object.codePath);
+        object.length = exported.size() + object.design->code.size();
+        readLength_ += object.length;
+        readDesigns_.push_back(&object);
+        if (!object.stowed.empty())
+            RestoreWrittenValues(object);
     } catch (const RaisedError& failure) {
         object.error = failure.what();
     }
+}
+
+void ApplicationModel::TrimDesigns() {
+    while (readLength_ > kKeptDesignBytes && !readDesigns_.empty()) {
+        Object& oldest = *readDesigns_.front();
+        readDesigns_.pop_front();
+        if (!written_.empty())
+            StowWrittenValues(oldest);
+        readLength_ -= oldest.length;
+        oldest.design.reset();
+        oldest.loaded = false;
+    }
+}
+
+void ApplicationModel::StowWrittenValues(Object& object) {
+    const auto stow = [&](const void* owner, const std::string& name) {
+        if (auto values = written_.extract(owner))
+            object.stowed.emplace(name, std::move(values.mapped()));
+    };
+    stow(object.design.get(), {});
+    ForEachNamed(*object.design->root, [&](const DesignObject& part) { stow(&part, part.name); });
+}
+
+void ApplicationModel::RestoreWrittenValues(Object& object) {
+    const auto restore = [&](const void* owner, const std::string& name) {
+        if (auto values = object.stowed.extract(name))
+            written_.emplace(owner, std::move(values.mapped()));
+    };
+    restore(object.design.get(), {});
+    ForEachNamed(*object.design->root, [&](const DesignObject& part) { restore(&part, part.name); });
 }
 
 const Design& ApplicationModel::OpenDesign(ObjectKind kind, const std::string& name) {

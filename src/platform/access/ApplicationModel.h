@@ -7,6 +7,8 @@
 #include "platform/access/OpenObject.h"
 #include "platform/access/QueryReader.h"
 
+#include <deque>
+#include <map>
 #include <memory>
 #include <string>
 #include <unordered_map>
@@ -18,6 +20,9 @@ namespace tovimar::platform::access {
 /// designs, definitions and records when they are first asked for.
 class ApplicationModel : public ApplicationSource {
 public:
+    /// By the folded name of the property.
+    using WrittenProperties = std::unordered_map<std::string, Value>;
+
     /// Raises as OpenAccessApplication.
     explicit ApplicationModel(const std::string& nativePath);
     ~ApplicationModel() override;
@@ -40,6 +45,10 @@ public:
     /// Empty without a reason against opening the object.
     std::string DesignError(ObjectKind kind, const std::string& name);
     bool DesignKnown(ObjectKind kind, const std::string& name) const;
+    /// Forgets designs that were read longest ago, but for the last 8 MiB of export text; they are read again
+    /// on demand, and written values come back with them. To be called when no object is open: pointers to
+    /// designs end here.
+    void TrimDesigns();
     /// Text of the object's export with its code, UTF-8. Raises as OpenDesign.
     std::string ExportText(ObjectKind kind, const std::string& name);
     /// Source of a module; none when there is no such module or its source isn't known.
@@ -60,7 +69,7 @@ public:
     const std::vector<std::uint32_t>& ThemeColors() override;
 
     /// Values that were written to an object's properties; they last as long as the application.
-    std::unordered_map<std::string, Value>& WrittenValues(const void* object) { return written_[object]; }
+    WrittenProperties& WrittenValues(const void* object) { return written_[object]; }
     /// Null for a property that wasn't written.
     const Value* WrittenValue(const void* object, std::string_view name) const {
         const auto values = written_.find(object);
@@ -78,7 +87,10 @@ private:
         std::string database; ///< native path, for objects of a database
         NamedTexts properties;
         bool loaded = false;
-        std::unique_ptr<Design> design;
+        std::shared_ptr<Design> design;
+        std::size_t length = 0; ///< bytes of text that the design was read from
+        /// Written values of a design that was forgotten, by part; "" is the object itself.
+        std::map<std::string, WrittenProperties> stowed;
         std::string error;
     };
     struct Table {
@@ -113,6 +125,8 @@ private:
     Objects& ListOf(ObjectKind kind);
     Object& Demand(ObjectKind kind, const std::string& name);
     void Load(ObjectKind kind, Object& object);
+    void StowWrittenValues(Object& object);
+    void RestoreWrittenValues(Object& object);
     Table& TableNamed(const std::string& name);
     void LoadTable(Table& table);
     void ReadTable(Table& table);
@@ -133,6 +147,8 @@ private:
     std::vector<std::string> codePaths_;
     std::vector<std::pair<std::string, std::string>> queryInfos_; ///< name, path
     Objects forms_, reports_, macros_, modules_;
+    std::deque<Object*> readDesigns_; ///< in the order of reading
+    std::size_t readLength_ = 0;
     KeyedList<std::unique_ptr<Table>> tables_;
     KeyedList<std::unique_ptr<Query>> queries_;
     std::vector<RelationDefinition> relations_;
@@ -141,7 +157,7 @@ private:
     std::vector<std::string> names_[6];
     bool kindInExports_[6] = {};
     std::unordered_map<std::string, std::unique_ptr<Records>> records_;
-    std::unordered_map<const void*, std::unordered_map<std::string, Value>> written_;
+    std::unordered_map<const void*, WrittenProperties> written_;
 };
 
 /// What the application holds, see AccessApplication.h.

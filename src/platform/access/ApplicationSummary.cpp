@@ -36,6 +36,7 @@ ObjectSummary Summarize(ApplicationModel& model, ObjectKind kind, const std::str
         summary.caption = text::Trim(design->root->Text("Caption"));
     if (summary.designKnown)
         summary.error = model.DesignError(kind, name);
+    model.TrimDesigns();
     return summary;
 }
 

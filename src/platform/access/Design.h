@@ -76,7 +76,8 @@ struct SectionRef {
     const DesignObject* object = nullptr;
 };
 
-struct Design {
+/// Shared by the application and the windows that show it; the application may let it go and read it again.
+struct Design : std::enable_shared_from_this<Design> {
     ObjectKind kind = ObjectKind::Form;
     std::string name;                   ///< of the object in the application
     std::unique_ptr<DesignObject> root; ///< null for a name without a design

@@ -52,8 +52,8 @@ const MemberTable<WindowObject>& WindowObject::Members() {
 }
 
 WindowObject::WindowObject(SessionRef session, const Design& design, View view, bool hidden)
-    : session_(std::move(session)) {
-    open_.design = &design;
+    : session_(std::move(session)), design_(design.shared_from_this()) {
+    open_.design = design_.get();
     open_.application = &Session()->Model();
     open_.view = view;
     open_.hidden = hidden;

@@ -82,6 +82,7 @@ private:
     Value Nothing(const Arguments&) { return {}; }
 
     SessionRef session_;
+    std::shared_ptr<const Design> design_;
     OpenObject open_;
     bool nested_ = false;
     bool closed_ = false;

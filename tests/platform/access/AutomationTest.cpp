@@ -125,6 +125,31 @@ TEST_F(AutomationTest, OpensWindowsAndClosesThem) {
     EXPECT_EQ(RaisedBy([&] { command->Call("OpenForm", {"Orders"}); }).number, 2467);
 }
 
+TEST_F(AutomationTest, ForgetsDesignsOfClosedFormsButNotWhatWasWritten) {
+    const auto writeForm = [&](const std::string& name, const std::string& caption) {
+        Part("forms\\" + name + ".form",
+             SmallForm("Begin TextBox\r\nName =\"t\"\r\nEnd\r\n", "    Caption =\"" + caption + "\"\r\n") +
+                 "CodeBehindForm\r\n" + std::string(5U << 20U, '\'') + "\r\n");
+    };
+    writeForm("BigA", "First");
+    writeForm("BigB", "Other");
+    application = Open();
+    command = Object(application, "DoCmd");
+    const auto form = OpenForm("BigA", 1);
+    form->Set("HelpContextId", 7);
+    Control(form, "t")->Set("HelpContextId", 8);
+    // A changed file shows that it is read again; one that is open stays as it was.
+    writeForm("BigA", "Second");
+    EXPECT_EQ(Text(form, "Caption"), "First");
+    command->Call("Close", {2, "BigA", 2});
+    OpenForm("BigB", 1);
+    command->Call("Close", {2, "BigB", 2});
+    const auto again = OpenForm("BigA", 1);
+    EXPECT_EQ(Text(again, "Caption"), "Second");
+    EXPECT_EQ(again->Get("HelpContextId"), Value(7));
+    EXPECT_EQ(Control(again, "t")->Get("HelpContextId"), Value(8));
+}
+
 TEST_F(AutomationTest, ShowsTheSectionsOfTheView) {
     const auto design = OpenForm("Orders", 1);
     EXPECT_EQ(Object(design, "Section", {2})->Get("Height"), Value(300));
