@@ -146,6 +146,13 @@ Value ApplicationObject::SysCmd(const Arguments& arguments) {
     return {};
 }
 
+AccessSession& SessionOf(const HostObject& application) {
+    const auto opened = std::dynamic_pointer_cast<ApplicationObject>(application);
+    if (!opened)
+        RaiseNoSuchMember("Application");
+    return opened->Session();
+}
+
 } // namespace
 
 HostObject OpenAccessApplication(const std::string& nativePath) {
@@ -156,10 +163,11 @@ HostObject OpenAccessApplication(const std::string& nativePath) {
 }
 
 ApplicationSummary SummarizeApplication(const HostObject& application) {
-    const auto opened = std::dynamic_pointer_cast<ApplicationObject>(application);
-    if (!opened)
-        RaiseNoSuchMember("Application");
-    return SummarizeModel(opened->Session().Model());
+    return SummarizeModel(SessionOf(application).Model());
+}
+
+void SetObjectSaver(const HostObject& application, ObjectSaver saver) {
+    SessionOf(application).saver = std::move(saver);
 }
 
 } // namespace tovimar::platform::access

@@ -2,12 +2,18 @@
 
 #include "platform/AutomationObject.h"
 #include "platform/access/Design.h"
+#include "platform/access/ExportWriter.h"
 
+#include <functional>
 #include <string>
 #include <vector>
 
 /// The host application read from files: the late-bound `Application` object with everything below it.
 namespace tovimar::platform::access {
+
+/// A folder inside an application that holds a file of this name is passed over: copies of exports that
+/// aren't to be read in place of the originals.
+inline constexpr const char* kNoApplicationMark = "README.copies";
 
 /// Opens what stands at a native path: a folder of text exports, a database file (`.accdb`, `.mdb`,
 /// `.accde`, `.mde`), or a folder that holds both. Exports win over the database; tables that only the
@@ -16,6 +22,19 @@ namespace tovimar::platform::access {
 /// Raises 0x80040001: "No Access application found in <path>." for a folder without any object, and a text
 /// with the native path and the reason for a file that is no database.
 HostObject OpenAccessApplication(const std::string& nativePath);
+
+/// A form or report that was closed with its changes. Of a design only the help properties can be saved.
+struct SavedObject {
+    ObjectKind kind = ObjectKind::Form;
+    std::string name;
+    std::string exportPath; ///< Windows path of its export, empty for an object of a database file
+    HelpProperties changes;
+
+    bool HasChanges() const { return changes.contextId || changes.file; }
+};
+using ObjectSaver = std::function<void(const SavedObject&)>;
+/// Who keeps what is saved; nothing is written without a saver. What it raises, closing the object raises.
+void SetObjectSaver(const HostObject& application, ObjectSaver saver);
 
 /// One object as a listing shows it.
 struct ObjectSummary {

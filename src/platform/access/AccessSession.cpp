@@ -102,16 +102,19 @@ void AccessSession::OpenWindows(OpenObject& opened) {
     windows.Open(std::move(page));
 }
 
-void AccessSession::Close(ObjectKind kind, const std::string& name) {
+void AccessSession::Close(ObjectKind kind, const std::string& name, Saving saving) {
     const auto object = FindOpen(kind, name);
     if (!object)
         return;
+    const SavedObject saved = saving == Saving::Yes ? model_->ChangesOf(object->DesignOf()) : SavedObject();
     if (object->Opened().window != 0)
         Env().windows->Close(object->Opened().window);
     object->MarkClosed();
     std::erase(open_, object);
     if (open_.empty())
         model_->TrimDesigns();
+    if (saver && saved.HasChanges())
+        saver(saved);
 }
 
 std::shared_ptr<WindowObject> AccessSession::Active(ObjectKind kind) const {

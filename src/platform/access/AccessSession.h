@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/access/AccessApplication.h"
 #include "platform/access/ApplicationModel.h"
 #include "platform/access/LateBound.h"
 
@@ -26,8 +27,9 @@ public:
     /// Opens a form or report; one that is open in another view is closed first.
     /// Raises 2102 and 2103 for an unknown name, 0x80040001 for a design that can't be read.
     void Open(ObjectKind kind, const std::string& name, View view, bool hidden);
-    /// Nothing happens for an object that isn't open.
-    void Close(ObjectKind kind, const std::string& name);
+    /// Nothing happens for an object that isn't open. Saving hands changed properties over to the saver.
+    enum class Saving { No, Yes };
+    void Close(ObjectKind kind, const std::string& name, Saving saving = Saving::No);
     std::shared_ptr<WindowObject> FindOpen(ObjectKind kind, const std::string& name) const;
     /// In the order in which they were opened.
     std::vector<std::shared_ptr<WindowObject>> OpenObjects(ObjectKind kind) const;
@@ -41,6 +43,7 @@ public:
     std::string currentObjectName;
     std::int32_t currentObjectType = -1;
     std::string meterMessage;
+    ObjectSaver saver; ///< none: what is saved lasts as long as the application
 
 private:
     std::string BaseTitle() const;

@@ -2,6 +2,7 @@
 
 #include "platform/Environment.h"
 #include "platform/Error.h"
+#include "platform/access/AccessApplication.h"
 #include "platform/access/ExportReader.h"
 #include "platform/access/HexDigit.h"
 #include "platform/files/Paths.h"
@@ -207,6 +208,9 @@ private:
 
     void ScanLevel(const std::string& path, int depth, std::vector<std::string>& next) {
         auto& files = *Env().files;
+        // The folder that was asked for is read in any case: copies may have been put over it, note and all.
+        if (depth > 0 && files.FileExists(path + "\\" + kNoApplicationMark))
+            return;
         const auto hint = HintOf(FileNameOf(path));
         for (const auto& name : files.ListFiles(path, "*.*"))
             if (!IsHidden(name) && ++seen_ <= kMaxFiles)

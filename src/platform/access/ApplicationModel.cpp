@@ -233,6 +233,17 @@ std::string ApplicationModel::ExportText(ObjectKind kind, const std::string& nam
     return exported;
 }
 
+SavedObject ApplicationModel::ChangesOf(const Design& design) const {
+    SavedObject saved{design.kind, design.name, {}, {}};
+    if (const auto* object = const_cast<ApplicationModel&>(*this).ListOf(design.kind).Find(design.name))
+        saved.exportPath = (*object)->path;
+    if (const Value* id = WrittenValue(&design, "HelpContextId"))
+        saved.changes.contextId = id->AsInteger();
+    if (const Value* file = WrittenValue(&design, "HelpFile"))
+        saved.changes.file = file->AsString();
+    return saved;
+}
+
 std::optional<std::string> ApplicationModel::ModuleCode(const std::string& name) {
     const auto* object = modules_.Find(name);
     if (!object || (*object)->path.empty())

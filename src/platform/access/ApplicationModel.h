@@ -2,6 +2,7 @@
 
 #include "platform/KeyedList.h"
 #include "platform/Value.h"
+#include "platform/access/AccessApplication.h"
 #include "platform/access/ApplicationFolder.h"
 #include "platform/access/DatabaseReader.h"
 #include "platform/access/OpenObject.h"
@@ -70,6 +71,8 @@ public:
 
     /// Values that were written to an object's properties; they last as long as the application.
     WrittenProperties& WrittenValues(const void* object) { return written_[object]; }
+    /// The written help properties of a form or report.
+    SavedObject ChangesOf(const Design& design) const;
     /// Null for a property that wasn't written.
     const Value* WrittenValue(const void* object, std::string_view name) const {
         const auto values = written_.find(object);

@@ -1,41 +1,20 @@
+#include "platform/access/ExportEncoding.h"
 #include "platform/access/ExportReader.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
-#include <array>
 
 namespace tovimar::platform::access {
 
 namespace {
 
-enum class Utf16Order { None, Little, Big };
-
-/// Order of a UTF-16 text: by its mark, else by zero bytes, which no other text encoding has in its start.
-Utf16Order FindUtf16Order(std::string_view bytes) {
-    if (bytes.starts_with("\xFF\xFE"))
-        return Utf16Order::Little;
-    if (bytes.starts_with("\xFE\xFF"))
-        return Utf16Order::Big;
-    const auto start = bytes.substr(0, std::min<std::size_t>(bytes.size() & ~std::size_t{1}, 256));
-    std::array<std::size_t, 2> zeros{};
-    for (std::size_t i = 0; i < start.size(); ++i)
-        if (start[i] == '\0')
-            ++zeros[i % 2];
-    const std::size_t many = start.size() / 4;
-    if (many > 0 && zeros[1] > many && zeros[0] == 0)
-        return Utf16Order::Little;
-    if (many > 0 && zeros[0] > many && zeros[1] == 0)
-        return Utf16Order::Big;
-    return Utf16Order::None;
-}
-
-std::string DecodeUtf16(std::string_view bytes, Utf16Order order) {
+std::string DecodeUtf16(std::string_view bytes, ExportEncoding encoding) {
     std::u16string units;
     units.reserve(bytes.size() / 2);
     for (std::size_t i = 0; i + 1 < bytes.size(); i += 2) {
         const auto first = static_cast<unsigned char>(bytes[i]);
         const auto second = static_cast<unsigned char>(bytes[i + 1]);
-        const int unit = order == Utf16Order::Little ? second << 8 | first : first << 8 | second;
+        const int unit = encoding == ExportEncoding::Utf16Little ? second << 8 | first : first << 8 | second;
         if (unit != 0xFEFF)
             units.push_back(static_cast<char16_t>(unit));
     }
@@ -102,13 +81,16 @@ bool IsHeaderLine(std::string_view line, bool& inClassHeader) {
 } // namespace
 
 std::string DecodeExportText(std::string_view bytes) {
-    const auto order = FindUtf16Order(bytes);
-    if (order != Utf16Order::None)
-        return DecodeUtf16(bytes, order);
-    if (bytes.starts_with("\xEF\xBB\xBF"))
-        return text::MakeValidUtf8(bytes.substr(3));
-    if (text::IsValidUtf8(bytes))
-        return std::string(bytes);
+    const auto encoding = FindExportEncoding(bytes);
+    switch (encoding) {
+    case ExportEncoding::Utf16Little:
+    case ExportEncoding::Utf16Big:
+        return DecodeUtf16(bytes, encoding);
+    case ExportEncoding::Utf8:
+        return text::MakeValidUtf8(bytes.substr(bytes.starts_with("\xEF\xBB\xBF") ? 3 : 0));
+    case ExportEncoding::Ansi:
+        break;
+    }
     return text::AnsiCodePage().Decode(bytes);
 }
 

@@ -190,8 +190,11 @@ private:
         const auto session = Live(session_);
         const auto type = IntegerAt(arguments, 0, session->currentObjectType);
         const auto name = arguments.size() > 1 ? TextAt(arguments, 1) : session->currentObjectName;
+        constexpr std::int32_t kSave = 1;
+        const auto saving =
+            IntegerAt(arguments, 2) == kSave ? AccessSession::Saving::Yes : AccessSession::Saving::No;
         if (type == 2 || type == 3)
-            session->Close(static_cast<ObjectKind>(type), name);
+            session->Close(static_cast<ObjectKind>(type), name, saving);
         return {};
     }
     Value SelectObject(const Arguments& arguments) {
