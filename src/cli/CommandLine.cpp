@@ -32,6 +32,8 @@ void AddGenerate(CLI::App& app, Arguments& parsed, std::vector<std::string>& opt
         ->add_option("--copy-to", parsed.copyTo,
                      "folder of the copy of the compiled help; beside SOURCE when not given")
         ->type_name("DIR");
+    generate->add_flag("--write-back", parsed.writeBack,
+                       "write new context ids into the exports of SOURCE; each changed one is kept as .bak");
     generate->add_flag("--verbose", parsed.verbose, "tell each object, warnings and the compiler's output");
     generate->callback([&] { parsed.command = Arguments::Command::Generate; });
 }

@@ -26,6 +26,7 @@ struct Arguments {
     ObjectKind objectKind = ObjectKind::Any;
     bool topic = false;
     bool compile = true;
+    bool writeBack = false; ///< context ids go into the exports themselves
     bool verbose = false;
     /// Set when there is nothing to run: help and version were printed, or the line wasn't understood.
     bool ended = false;

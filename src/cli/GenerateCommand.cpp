@@ -12,6 +12,7 @@
 #include "generation/CTovimarCompiler.h"
 #include "generation/HelpUtilities.h"
 #include "generation/RunProgress.h"
+#include "generation/SourceChanges.h"
 #include "host/server/CTovimarClient.h"
 #include "host/server/CTovimarServer.h"
 #include "host/server/CTovimarServerData.h"
@@ -23,6 +24,7 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <optional>
 
 namespace tovimar::cli {
 namespace {
@@ -55,14 +57,17 @@ private:
     void CheckCompiler() const;
     void Prepare();
     void CheckTarget();
+    void KeepSourceChanges();
     int Write();
     int Judge(CTovimarActions::Outcome outcome);
     void ShowResult() const;
+    void ShowSourceChanges() const;
     CTovimarParameters& Parameters() const { return *Session::Parameters(); }
 
     const Arguments& arguments_;
     Surroundings& surroundings_;
     HostObject source_;
+    std::optional<SourceChanges> changes_;
     CTovimarClient client_;
     CTovimarActions actions_;
     GenerationRequest request_;
@@ -108,6 +113,8 @@ void Generation::TakeOptions() {
     CAddInSettings().Load(settings, /*vfLoadFromProjectFile=*/false);
     if (!arguments_.compile)
         Parameters().CompileHTMLHelp = false;
+    if (arguments_.writeBack)
+        Parameters().SaveApplicationChanges = true;
     if (!arguments_.output.empty())
         request_.folder = platform::Env().files->FromNative(FullPath(arguments_.output));
     if (!arguments_.copyTo.empty())
@@ -175,8 +182,20 @@ void Generation::CheckTarget() {
                "makes none.");
 }
 
+/// Ids go into copies unless the originals were asked for: nobody's sources change by an option of a project.
+void Generation::KeepSourceChanges() {
+    if (!Parameters().SaveApplicationChanges)
+        return;
+    const auto target =
+        arguments_.writeBack ? SourceChanges::Target::Originals : SourceChanges::Target::Copies;
+    changes_.emplace(target, platform::FolderOf(Session::Context().CurrentSourceProjectFullPath()),
+                     Parameters().FolderForGeneratedHelp() + "application");
+    changes_->Attach(source_);
+}
+
 int Generation::Write() {
     StopIfInterrupted();
+    KeepSourceChanges();
     surroundings_.Progress().Phase("Writing help to " +
                                    platform::Env().files->ToNative(Parameters().FolderForGeneratedHelp()));
     const auto outcome = actions_.GenerateFromOptions();
@@ -216,8 +235,28 @@ void Generation::ShowResult() const {
         if (!text::EqualsIgnoringCase(compiled, copied))
             ShowFile("Copied to:     ", copied);
     }
+    ShowSourceChanges();
     ShowFile("Web help:      ", Parameters().FolderForGeneratedHelp() + "main.htm");
     ShowFile("Project:       ", Session::CurrentProject()->TvpFullPath());
+}
+
+void Generation::ShowSourceChanges() const {
+    if (!changes_)
+        return;
+    if (const auto count = changes_->Written(); count > 0) {
+        const std::string objects = std::to_string(count) + (count == 1 ? " export" : " exports");
+        if (arguments_.writeBack)
+            PrintResult("Context ids:   " + objects + " changed, the old texts beside them as .bak");
+        else
+            PrintResult("Context ids:   " + objects + " to change, as copies in " +
+                        platform::Env().files->ToNative(changes_->CopiesFolder()));
+    }
+    std::error_code ignored;
+    if (!changes_->NotWritten().empty() || !fs::is_directory(arguments_.source, ignored))
+        PrintWarning("context ids can't be written into a database file; '" +
+                     platform::Env().files->ToNative(Parameters().FolderForGeneratedHelp() +
+                                                     Parameters().HelpProjectName() + ".h") +
+                     "' lists them");
 }
 
 } // namespace

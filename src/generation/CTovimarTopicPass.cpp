@@ -281,6 +281,14 @@ void MakePrintedContents(CHelpPrjTreeNode& root, const CTovimarParameters& param
     page.Save(parameters.FolderForGeneratedHelp() + parameters.HelpProjectName() + "TOC.htm");
 }
 
+/// The pass writes over the definitions of an earlier run.
+void StartContextIds(std::unique_ptr<clsFrmRptHelpContextIds>& ids) {
+    ids = std::make_unique<clsFrmRptHelpContextIds>();
+    const auto* project = Session::CurrentProject();
+    if (project != nullptr && platform::Env().files->FileExists(project->TvpFullPath()))
+        ids->LoadEarlierIds(project->XmlFormsFolder());
+}
+
 struct StyleSheetCopy {
     std::string source;
     std::string target;
@@ -310,7 +318,7 @@ void CTovimar::ProcessHelpTreeAndGenerateHelp(std::int32_t level, CHelpPrjTreeNo
         return;
     Trapped(kClass, "ProcessHelpTreeAndGenerateHelp", [&] {
         if (!vfRegenerate && level == 0)
-            helpContextIds_ = std::make_unique<clsFrmRptHelpContextIds>();
+            StartContextIds(helpContextIds_);
         std::optional<HostMeter> meter;
         if (vfShowProgress)
             meter.emplace("Processing TOC...", maxNodes);

@@ -115,6 +115,7 @@ void ObjectTopic::TakeOver() {
     node_.SetSourceProjectName(form_->SourceProjectName);
     node_.SetSourceProjectType(form_->SourceProjectType);
     generator_.HelpContextIds().ExtractUsedHelpContextIds(*form_);
+    generator_.HelpContextIds().RecallEarlierIds(*form_);
     const bool pictured = type_ == ObjectType::kForm ||
                           (type_ == ObjectType::kReport && generator_.Parameters().AddImageForReport);
     if (!pictured)

@@ -46,6 +46,21 @@ bool IsWithoutOwnId(const CXmlForm& form) {
     return form.GUIObjectSubType == "UserControl" || form.GUIObjectSubType == "UserDocument";
 }
 
+/// A control inside another one is told by both names.
+std::string OwnerOf(const CXmlControl& control, const CXmlControl& child) {
+    return control.Name + '/' + child.Name;
+}
+
+std::string Key(const std::string& form, const std::string& control) {
+    return form + '\n' + control;
+}
+
+/// Other objects have numbers too, but no property to hold them; one may bear the name of a form.
+bool HasHelpProperties(const CXmlForm& form) {
+    const std::string& type = form.Type_();
+    return type != "Table" && type != "Query" && type != "Macro" && type != "Worksheet" && type != "Chart";
+}
+
 void WriteIdIntoSource(const CXmlForm& form, std::int32_t type) {
     auto& host = HostAgent();
     host.ActivateComponent(type, form.Name, /*forceOpenInDesignView=*/true, /*forceOpenAsHidden=*/true);
@@ -59,6 +74,8 @@ void clsFrmRptHelpContextIds::Reset() {
     forms_.Clear();
     usedIds_.Clear();
     duplicates_.clear();
+    earlier_ = {};
+    recalled_.clear();
 }
 
 void clsFrmRptHelpContextIds::AddUsedId(std::int32_t id, const std::string& form,
@@ -95,7 +112,7 @@ void clsFrmRptHelpContextIds::ExtractUsedHelpContextIds(const CXmlForm& rxmlForm
 std::int32_t clsFrmRptHelpContextIds::NextFreeId(bool vfReserve) {
     for (int tries = 0; tries < kMostTries; ++tries) {
         lastId_ += kStep;
-        if (IsIdUsed(lastId_))
+        if (IsIdUsed(lastId_) || earlier_.Holds(lastId_))
             continue;
         if (vfReserve)
             usedIds_.Add(lastId_, std::to_string(lastId_));
@@ -113,6 +130,7 @@ void clsFrmRptHelpContextIds::AssignHelpContextIds() {
             AssignHelpContextIdsForForm(name);
             meter.Update(++position);
         }
+        recalled_.clear();
     });
 }
 
@@ -123,25 +141,62 @@ void clsFrmRptHelpContextIds::AssignHelpContextIdsForForm(const std::string& nam
         if (form == nullptr)
             return;
         form->NewHelpContextIdsCount = 0;
-        if (form->HelpContextId == 0 && !IsWithoutOwnId(*form)) {
-            form->HelpContextId = NextFreeId(true);
+        if (IsWithoutId(form->HelpContextId, name, {}) && !IsWithoutOwnId(*form)) {
+            form->HelpContextId = IdFor(name, {});
             form->NewHelpContextIdsCount = 1;
         }
         for (const auto& control : form->Controls) {
-            if (control->HelpContextId == 0)
-                control->HelpContextId = NextFreeId(true);
-            AssignHelpContextIdsForSubControls(*control);
+            if (IsWithoutId(control->HelpContextId, name, control->Name))
+                control->HelpContextId = IdFor(name, control->Name);
+            AssignHelpContextIdsForSubControls(name, *control);
         }
         Definitions().Save(form, path);
     });
 }
 
-void clsFrmRptHelpContextIds::AssignHelpContextIdsForSubControls(CXmlControl& control) {
+void clsFrmRptHelpContextIds::AssignHelpContextIdsForSubControls(const std::string& form,
+                                                                 CXmlControl& control) {
     Trapped(kClass, "AssignHelpContextIdsForSubControls", [&] {
-        for (const auto& child : control.Controls)
-            if (child->HelpContextId < 1)
-                child->HelpContextId = NextFreeId(true);
+        for (const auto& child : control.Controls) {
+            const std::string owner = OwnerOf(control, *child);
+            if (child->HelpContextId < 1 || IsWithoutId(child->HelpContextId, form, owner))
+                child->HelpContextId = IdFor(form, owner);
+        }
     });
+}
+
+void clsFrmRptHelpContextIds::RecallEarlierIds(CXmlForm& rxmlForm) {
+    Trapped(kClass, "RecallEarlierIds", [&] {
+        const std::string name = rxmlForm.UniqueName();
+        if (!IsWithoutOwnId(rxmlForm))
+            Recall(rxmlForm.HelpContextId, name, {});
+        for (const auto& control : rxmlForm.Controls) {
+            Recall(control->HelpContextId, name, control->Name);
+            for (const auto& child : control->Controls)
+                Recall(child->HelpContextId, name, OwnerOf(*control, *child));
+        }
+    });
+}
+
+void clsFrmRptHelpContextIds::Recall(std::int32_t& id, const std::string& form, const std::string& control) {
+    if (id != 0)
+        return;
+    id = earlier_.IdOf(form, control);
+    if (id != 0)
+        recalled_.insert(Key(form, control));
+}
+
+bool clsFrmRptHelpContextIds::IsWithoutId(std::int32_t id, const std::string& form,
+                                          const std::string& control) const {
+    return id == 0 || recalled_.contains(Key(form, control));
+}
+
+std::int32_t clsFrmRptHelpContextIds::IdFor(const std::string& form, const std::string& control) {
+    const std::int32_t earlier = earlier_.IdOf(form, control);
+    if (earlier == 0 || IsIdUsed(earlier))
+        return NextFreeId(true);
+    usedIds_.Add(earlier, std::to_string(earlier));
+    return earlier;
 }
 
 void clsFrmRptHelpContextIds::SetHelpContextIds() {
@@ -170,7 +225,7 @@ std::string clsFrmRptHelpContextIds::SetHelpContextIdsForForm(const std::string&
             return;
         const std::int32_t type = form->Type_() == "Report" ? ObjectType::kReport : ObjectType::kForm;
         if (form->NewHelpContextIdsCount >= 1 && Session::Parameters()->SaveApplicationChanges &&
-            !SourceIs(SourceProjectKind::kAspNet))
+            !SourceIs(SourceProjectKind::kAspNet) && HasHelpProperties(*form))
             WriteIdIntoSource(*form, type);
         line = DefineLine(name, form->HelpContextId);
     });

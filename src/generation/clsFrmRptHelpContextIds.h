@@ -1,9 +1,11 @@
 #pragma once
 
+#include "generation/EarlierContextIds.h"
 #include "platform/KeyedList.h"
 
 #include <cstdint>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 namespace tovimar {
@@ -21,7 +23,13 @@ public:
 
     /// Takes over the ids of an object and its controls, or of one control's children; an object counts once.
     void ExtractUsedHelpContextIds(const CXmlForm& rxmlForm, const CXmlControl* rxmlControl = nullptr);
-    /// Gives ids to what has none, in the saved definitions.
+    /// Reads what an earlier run of the project has given, before its definitions are written over.
+    void LoadEarlierIds(const std::string& definitionsFolder) { earlier_.Load(definitionsFolder); }
+    /// Puts the earlier ids into a definition whose source has none, so that they outlive a run that is
+    /// stopped. They are confirmed when ids are assigned: a number that the application uses elsewhere by
+    /// now is replaced.
+    void RecallEarlierIds(CXmlForm& rxmlForm);
+    /// Gives ids to what has none, in the saved definitions: the earlier one, else a new number.
     void AssignHelpContextIds();
     /// Writes new ids into the source's objects, where that is asked for, and the include file.
     void SetHelpContextIds();
@@ -35,8 +43,11 @@ public:
 
 private:
     void AddUsedId(std::int32_t id, const std::string& form, const std::string& control);
+    void Recall(std::int32_t& id, const std::string& form, const std::string& control);
+    bool IsWithoutId(std::int32_t id, const std::string& form, const std::string& control) const;
+    std::int32_t IdFor(const std::string& form, const std::string& control);
     void AssignHelpContextIdsForForm(const std::string& name);
-    void AssignHelpContextIdsForSubControls(CXmlControl& control);
+    void AssignHelpContextIdsForSubControls(const std::string& form, CXmlControl& control);
     std::string SetHelpContextIdsForForm(const std::string& name);
     std::string DefinitionPath(const std::string& name) const;
     void WriteIncludeFile(std::string text);
@@ -44,6 +55,8 @@ private:
     KeyedList<std::string> forms_;
     KeyedList<std::int32_t> usedIds_;
     std::vector<std::string> duplicates_;
+    EarlierContextIds earlier_;
+    std::unordered_set<std::string> recalled_; ///< owners whose number isn't confirmed yet
     std::int32_t lastId_ = 0;
 };
 

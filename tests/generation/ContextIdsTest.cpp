@@ -80,6 +80,62 @@ TEST_F(ContextIdsTest, NewIdsGoIntoTheApplicationHidden) {
     EXPECT_EQ(1, Sent("CloseComponent"));
 }
 
+TEST_F(ContextIdsTest, ATableIsNotWrittenIntoTheFormOfItsName) {
+    Parameters().SaveApplicationChanges = true;
+    const std::string xml = "<Table Name=\"Orders\" Text=\"x\" HtmlFileName=\"T.htm\"></Table>";
+    WriteFile("help\\xml\\T.xml", xml);
+    CXmlForm table;
+    ASSERT_EQ(kSuccess, table.LoadXml(xml));
+    ids.ExtractUsedHelpContextIds(table);
+    ids.AssignHelpContextIds();
+    sent.clear();
+    ids.SetHelpContextIds();
+    EXPECT_EQ(0, Sent("SetComponentHelpContextId"));
+    EXPECT_NE(std::string::npos, HelpFile("Shop.h").find("#define IDH_T  10\r\n"));
+}
+
+TEST_F(ContextIdsTest, EarlierIdsComeBackUnlessTheApplicationUsesThem) {
+    const auto pass = [&] {
+        See("Items", "",
+            Button("ok") + Button("tab", "><Controls>" + Button("in") + "</Controls></CommandButton>"));
+        See("Orders", "");
+        See("Gone", "");
+    };
+    pass();
+    ids.AssignHelpContextIds();
+    EXPECT_EQ(10, IdOf("Items"));
+    EXPECT_EQ(50, IdOf("Orders"));
+    EXPECT_EQ(60, IdOf("Gone"));
+
+    // A run that makes the project anew: "New" comes first, "Gone" is gone, a button of "Orders" took the
+    // number of one of "Items".
+    clsFrmRptHelpContextIds second;
+    second.LoadEarlierIds(project->Folder + "xml\\");
+    const auto seeAnew = [&](const std::string& name, const std::string& controls) {
+        See(name, "", controls);
+        CXmlForm form;
+        form.Load(project->Folder + "xml\\" + name + ".xml");
+        second.ExtractUsedHelpContextIds(form);
+        second.RecallEarlierIds(form);
+        form.SaveXml("", project->Folder + "xml\\" + name + ".xml");
+    };
+    seeAnew("New", {});
+    seeAnew("Items",
+            Button("ok") + Button("tab", "><Controls>" + Button("in") + "</Controls></CommandButton>"));
+    EXPECT_EQ(10, IdOf("Items")) << "a run that is stopped here has forgotten nothing";
+    seeAnew("Orders", Button("mine", "HelpContextId=\"20\"/>"));
+    second.AssignHelpContextIds();
+    EXPECT_EQ(70, IdOf("New")) << "the number of what is gone isn't given again";
+    EXPECT_EQ(10, IdOf("Items"));
+    EXPECT_EQ(50, IdOf("Orders"));
+    CXmlForm items;
+    items.Load(project->Folder + "xml\\Items.xml");
+    EXPECT_EQ(80, items.Controls.At(1)->HelpContextId) << "the application's own number wins";
+    EXPECT_EQ(30, items.Controls.At(2)->HelpContextId);
+    EXPECT_EQ(40, items.Controls.At(2)->Controls.At(1)->HelpContextId);
+    EXPECT_EQ(1, items.NewHelpContextIdsCount) << "the application doesn't know it yet";
+}
+
 TEST_F(ContextIdsTest, CompiledApplicationGetsNoHeader) {
     See("Orders", "");
     answers["CurrentSourceProjectIsMDEorADE"] = "True";
