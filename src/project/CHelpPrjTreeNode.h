@@ -8,7 +8,6 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <unordered_set>
 #include <vector>
 
 namespace tovimar {
@@ -22,6 +21,7 @@ class ITreeView;
 class ITreeViewNode;
 class IXmlSerializer;
 class clsHHK;
+struct ObjectContents;
 enum class TreeViewRelation;
 
 /// One entry of the table of contents: a group, a topic, a source object (form, report, table, query,
@@ -240,8 +240,8 @@ private:
     void AppendXmlLines(std::string& out, std::int32_t level);
     void AppendContents(std::string& out, std::int32_t level, ContentsStyle& style);
     void AppendObjectChildren(std::string& out, std::int32_t level, ContentsStyle& style);
-    std::unordered_set<std::string> AppendControls(std::string& out, std::int32_t level, CXmlForm& form,
-                                                   ContentsStyle& style) const;
+    bool RenewDefinition();
+    std::shared_ptr<const ObjectContents> ReadContents(bool renewControls);
     std::shared_ptr<CXmlForm> RenewControls();
     bool HasContentsEntry() const;
     void AppendContentsHtml(std::string& out, std::int32_t level, bool skipControlsNodes) const;

@@ -8,8 +8,8 @@
 #include "project/CHelpPrjTreeNode.h"
 #include "project/ComponentFileName.h"
 #include "project/ContentsStyle.h"
+#include "project/ObjectContents.h"
 #include "project/SitemapText.h"
-#include "topics/CFormHTMLControlDef.h"
 #include "uimodel/CXmlForm.h"
 
 #include <unordered_set>
@@ -78,10 +78,6 @@ private:
     std::string& options_;
 };
 
-std::string ControlText(const CFormHTMLControlDef& entry) {
-    return IdentifiedByName() ? entry.ControlName : entry.TopicCaption;
-}
-
 } // namespace
 
 std::string CHelpPrjTreeNode::ContentsLink() const {
@@ -135,22 +131,15 @@ bool CHelpPrjTreeNode::HasContentsEntry() const {
 }
 
 void CHelpPrjTreeNode::AppendObjectChildren(std::string& out, std::int32_t level, ContentsStyle& style) {
-    const bool running = Session::Run().generationInProgress;
-    // An unchanged topic doesn't cost a parse of its HTML on every build of the contents. A generation has
-    // just written its topics, and counts them as changed even where the bytes came out as before: the second
-    // run into a folder gives what the first one gave.
-    bool fileChanged = true;
-    bool defsChanged = false;
-    if (HelpPrjTree != nullptr) {
-        if (const auto* checkSum = HelpPrjTree->GetCheckSumObject(GeneratedHTMLFileFullPath()))
-            fileChanged = running || checkSum->CheckSumChanged();
-        if (fileChanged)
-            HelpPrjTree->MakeXmlFormControlDefs(*this, /*external=*/false, {}, defsChanged);
-        if (defsChanged)
-            DropChildrenControls();
-    }
+    // What the contents file has renewed a moment ago needn't be renewed for the web help.
+    auto contents =
+        HelpPrjTree == nullptr ? nullptr : HelpPrjTree->Definitions().KnownContents(XmlFormFullPath());
+    bool renew = false;
+    if (contents == nullptr)
+        renew = RenewDefinition();
     std::string childText;
     std::vector<std::pair<std::string, std::string>> controlTexts;
+    const bool running = Session::Run().generationInProgress;
     for (const auto& child : children_) {
         if (!child->HasContentsEntry())
             continue;
@@ -161,17 +150,60 @@ void CHelpPrjTreeNode::AppendObjectChildren(std::string& out, std::int32_t level
             child->AppendContents(controlTexts.back().second, level + 1, style);
         }
     }
-    const bool renew = (running || defsChanged) && fileChanged && HelpPrjTree != nullptr;
-    const auto form = renew ? RenewControls() : LoadXmlForm();
-    if (form == nullptr)
+    if (contents == nullptr)
+        contents = ReadContents(renew);
+    if (contents == nullptr)
         return;
     out += Indent(level) + "<UL>" + kCrLf;
-    const auto listed = AppendControls(out, level + 1, *form, style);
+    std::unordered_set<std::string> listed;
+    for (const auto& entry : contents->entries) {
+        style.AppendEntry(out, level + 1, GeneratedHTMLFile() + '#' + entry.anchor, entry.caption);
+        listed.insert(text::FoldCase(entry.controlName));
+    }
     // A control that the definition lists already has its entry.
     for (const auto& [name, text] : controlTexts)
         if (listed.count(text::FoldCase(name)) == 0)
             out += text;
     out += childText + Indent(level) + "</UL>" + kCrLf;
+}
+
+/// True when the control nodes must be made anew. An unchanged topic doesn't cost a parse of its HTML on
+/// every build of the contents. A generation has just written its topics, and counts them as changed even
+/// where the bytes came out as before: the second run into a folder gives what the first one gave.
+bool CHelpPrjTreeNode::RenewDefinition() {
+    if (HelpPrjTree == nullptr)
+        return false;
+    const bool running = Session::Run().generationInProgress;
+    bool fileChanged = true;
+    bool defsChanged = false;
+    if (const auto* checkSum = HelpPrjTree->GetCheckSumObject(GeneratedHTMLFileFullPath()))
+        fileChanged = running || checkSum->CheckSumChanged();
+    if (fileChanged)
+        HelpPrjTree->MakeXmlFormControlDefs(*this, /*external=*/false, {}, defsChanged);
+    if (defsChanged)
+        DropChildrenControls();
+    return (running || defsChanged) && fileChanged;
+}
+
+/// Null without a definition.
+std::shared_ptr<const ObjectContents> CHelpPrjTreeNode::ReadContents(bool renewControls) {
+    const auto form = renewControls ? RenewControls() : LoadXmlForm();
+    if (form == nullptr)
+        return nullptr;
+    const bool incomplete = form->DocumentedControls.Empty() && form->DocumentedMenus.Empty();
+    if (incomplete) {
+        if (platform::FileNameOf(form->HtmlFullPath()).empty())
+            form->SetHtmlFullPath(GeneratedHTMLFileFullPath());
+        if (platform::Env().files->FileExists(form->HtmlFullPath()))
+            form->MakeDefs(form->HtmlFullPath(), /*vfDoNotReplaceDefsIfTheSame=*/false);
+    }
+    auto contents = ContentsOf(*form);
+    // What was made in memory alone is no part of the definition that the index reads.
+    if (HelpPrjTree != nullptr && incomplete)
+        HelpPrjTree->Definitions().Forget(XmlFormFullPath());
+    if (HelpPrjTree != nullptr && !incomplete)
+        return HelpPrjTree->Definitions().NoteContents(XmlFormFullPath(), std::move(contents));
+    return std::make_shared<const ObjectContents>(std::move(contents));
 }
 
 std::shared_ptr<CXmlForm> CHelpPrjTreeNode::RenewControls() {
@@ -183,26 +215,6 @@ std::shared_ptr<CXmlForm> CHelpPrjTreeNode::RenewControls() {
         DisplayInTreeview(TreeView, HelpPrjTree, /*vfSkipSerializers=*/true, nullptr, nullptr, nullptr, false,
                           false, /*vfDisplayChildrenOnly=*/true);
     return form;
-}
-
-std::unordered_set<std::string> CHelpPrjTreeNode::AppendControls(std::string& out, std::int32_t level,
-                                                                 CXmlForm& form, ContentsStyle& style) const {
-    if (form.DocumentedControls.Empty() && form.DocumentedMenus.Empty()) {
-        if (platform::FileNameOf(form.HtmlFullPath()).empty())
-            form.SetHtmlFullPath(GeneratedHTMLFileFullPath());
-        if (platform::Env().files->FileExists(form.HtmlFullPath()))
-            form.MakeDefs(form.HtmlFullPath(), /*vfDoNotReplaceDefsIfTheSame=*/false);
-        if (HelpPrjTree != nullptr)
-            HelpPrjTree->Definitions().Forget(XmlFormFullPath());
-    }
-    std::unordered_set<std::string> listed;
-    for (const auto* entries : {&form.DocumentedMenus, &form.DocumentedControls})
-        for (const auto& entry : *entries) {
-            const auto link = GeneratedHTMLFile() + '#' + GetComponentAnchor(form.Name, entry->ControlName);
-            style.AppendEntry(out, level, link, ControlText(*entry));
-            listed.insert(text::FoldCase(entry->ControlName));
-        }
-    return listed;
 }
 
 std::string CHelpPrjTreeNode::ContentsHTML(std::int32_t vlngLevel, bool vfSkipControlsNodes) {

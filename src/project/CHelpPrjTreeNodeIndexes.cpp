@@ -5,6 +5,7 @@
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
+#include "project/ObjectContents.h"
 #include "project/clsHHK.h"
 #include "uimodel/CXmlForm.h"
 
@@ -73,9 +74,13 @@ void CHelpPrjTreeNode::AddIndexLinks(clsHHK& robjIndex) {
         return;
     const auto* project = Session::CurrentProject();
     if (IsObjectNode() && project != nullptr && HelpPrjTree != nullptr &&
-        platform::Env().files->FolderExists(project->XmlFormsFolder()))
-        if (const auto form = HelpPrjTree->Definitions().Load(XmlFormFullPath()))
+        platform::Env().files->FolderExists(project->XmlFormsFolder())) {
+        auto& definitions = HelpPrjTree->Definitions();
+        if (const auto known = definitions.KnownContents(XmlFormFullPath()))
+            robjIndex.AddLinks(known->links, known->topicFile);
+        else if (const auto form = definitions.Load(XmlFormFullPath()))
             robjIndex.AddXmlFormLinks(*form, GeneratedHTMLFile());
+    }
     for (const auto& word : IndexesCollection())
         robjIndex.AddCustomLink(Caption(), word, GeneratedHTMLFile(), {});
     for (const auto& child : children_)

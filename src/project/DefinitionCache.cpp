@@ -2,6 +2,7 @@
 
 #include "platform/Environment.h"
 #include "platform/text/Text.h"
+#include "project/ObjectContents.h"
 #include "uimodel/CXmlForm.h"
 
 #include <functional>
@@ -44,6 +45,7 @@ std::shared_ptr<CXmlForm> DefinitionCache::Load(const std::string& path) {
 }
 
 bool DefinitionCache::Save(const std::shared_ptr<CXmlForm>& form, const std::string& path) {
+    contents_.erase(text::FoldCase(path));
     const bool saved = !form->SaveXml({}, path).empty();
     if (holders_ > 0 && saved)
         Keep(text::FoldCase(path), form, platform::Env().files->ReadFile(path));
@@ -53,7 +55,26 @@ bool DefinitionCache::Save(const std::shared_ptr<CXmlForm>& form, const std::str
 }
 
 void DefinitionCache::Forget(const std::string& path) {
-    const auto known = entries_.find(text::FoldCase(path));
+    const auto key = text::FoldCase(path);
+    contents_.erase(key);
+    Drop(key);
+}
+
+std::shared_ptr<const ObjectContents> DefinitionCache::KnownContents(const std::string& path) const {
+    const auto known = contents_.find(text::FoldCase(path));
+    return known == contents_.end() ? nullptr : known->second;
+}
+
+std::shared_ptr<const ObjectContents> DefinitionCache::NoteContents(const std::string& path,
+                                                                    ObjectContents contents) {
+    auto noted = std::make_shared<const ObjectContents>(std::move(contents));
+    if (holders_ > 0)
+        contents_[text::FoldCase(path)] = noted;
+    return noted;
+}
+
+void DefinitionCache::Drop(const std::string& key) {
+    const auto known = entries_.find(key);
     if (known == entries_.end())
         return;
     bytes_ -= known->second.length;
@@ -61,13 +82,13 @@ void DefinitionCache::Forget(const std::string& path) {
 }
 
 void DefinitionCache::Keep(const std::string& key, std::shared_ptr<CXmlForm> form, const std::string& bytes) {
-    Forget(key);
+    Drop(key);
     bytes_ += bytes.size();
     entries_[key] = {std::move(form), bytes.size(), HashOf(bytes)};
     order_.push_back(key);
     while (bytes_ > kMostBytes && order_.size() > 1) {
         // A definition that was kept anew stands in the order twice; pushing it out early does no harm.
-        Forget(order_.front());
+        Drop(order_.front());
         order_.pop_front();
     }
 }
@@ -77,6 +98,7 @@ void DefinitionCache::Leave() {
         return;
     entries_.clear();
     order_.clear();
+    contents_.clear();
     bytes_ = 0;
 }
 

@@ -10,6 +10,7 @@
 namespace tovimar {
 
 class CXmlForm;
+struct ObjectContents;
 
 /// Loaded definitions of documented objects. Contents, index, web help and context ids of one run all ask
 /// for the same files; while somebody holds the cache a file is parsed once, and a file whose bytes changed
@@ -42,6 +43,12 @@ public:
     bool Save(const std::shared_ptr<CXmlForm>& form, const std::string& path);
     void Forget(const std::string& path);
 
+    /// What was noted of a definition since the cache is held; null when nothing was, or the definition was
+    /// saved or forgotten since.
+    std::shared_ptr<const ObjectContents> KnownContents(const std::string& path) const;
+    /// Without a holder nothing is noted.
+    std::shared_ptr<const ObjectContents> NoteContents(const std::string& path, ObjectContents contents);
+
 private:
     struct Entry {
         std::shared_ptr<CXmlForm> form;
@@ -50,12 +57,15 @@ private:
     };
 
     void Leave();
+    void Drop(const std::string& key);
     void Keep(const std::string& key, std::shared_ptr<CXmlForm> form, const std::string& bytes);
 
     int holders_ = 0;
     std::size_t bytes_ = 0;
     std::unordered_map<std::string, Entry> entries_;
     std::deque<std::string> order_;
+    /// By the folded path. Small beside the definitions, so those of all objects are kept.
+    std::unordered_map<std::string, std::shared_ptr<const ObjectContents>> contents_;
 };
 
 } // namespace tovimar

@@ -5,8 +5,7 @@
 #include "generation/CTovimarParameters.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
-#include "project/ComponentFileName.h"
-#include "project/SitemapText.h"
+#include "project/ObjectContents.h"
 #include "uimodel/CXmlForm.h"
 
 namespace tovimar {
@@ -15,22 +14,7 @@ namespace {
 
 constexpr std::size_t kLongestCaption = 32;
 
-std::vector<std::string> KeywordsOf(const std::string& indexes) {
-    std::vector<std::string> words;
-    for (auto& word : text::Split(indexes, "|"))
-        if (!word.empty())
-            words.push_back(std::move(word));
-    return words;
-}
-
 } // namespace
-
-/// What the index takes of a control or menu.
-struct clsHHK::Source {
-    std::string name;
-    std::string caption;
-    std::string indexes;
-};
 
 clsHHK::clsHHK() {
     Reset();
@@ -75,36 +59,12 @@ void clsHHK::AddCustomLink(const std::string& vstrIndexCaption, const std::strin
 }
 
 void clsHHK::AddXmlFormLinks(const CXmlForm& rxmlForm, const std::string& /*vstrGeneratedHtmlFile*/) {
-    const auto formCaption = TruncateCaption(rxmlForm.Caption());
-    const auto file = platform::FileNameOf(rxmlForm.HtmlFullPath());
-    for (const auto& word : KeywordsOf(rxmlForm.Indexes)) {
-        if (text::EqualsIgnoringCase(word, formCaption))
-            AddCustomLink(word, formCaption, file, {});
-        else
-            AddCustomLink(formCaption, word, file, {});
-    }
-    for (const auto& entry : rxmlForm.DocumentedControls) {
-        if (const auto* control = rxmlForm.GetControl(entry->ControlName))
-            AddControlLinks(rxmlForm, {control->Name, control->Caption(), control->Indexes}, formCaption,
-                            file);
-        else if (const auto* menu = rxmlForm.GetMenu(entry->ControlName))
-            AddControlLinks(rxmlForm, {menu->Name, menu->Text, menu->Indexes}, formCaption, file);
-    }
-    for (const auto& entry : rxmlForm.DocumentedMenus)
-        if (const auto* menu = rxmlForm.GetMenu(entry->ControlName))
-            AddControlLinks(rxmlForm, {menu->Name, menu->Text, menu->Indexes}, formCaption, file);
+    AddLinks(IndexLinksOf(rxmlForm), platform::FileNameOf(rxmlForm.HtmlFullPath()));
 }
 
-void clsHHK::AddControlLinks(const CXmlForm& form, const Source& source, const std::string& formCaption,
-                             const std::string& file) {
-    const auto caption =
-        TruncateCaption(IdentifiedByName() ? source.name : text::ReplaceAll(source.caption, "&", ""));
-    const auto bookmark = GetComponentAnchor(form.Name, source.name);
-    for (const auto& word : KeywordsOf(source.indexes)) {
-        // A keyword that only repeats the control's own caption is of use with the form's beside it.
-        const bool repeats = text::EqualsIgnoringCase(word, caption);
-        AddCustomLink(repeats ? formCaption : caption, word, file, bookmark);
-    }
+void clsHHK::AddLinks(const std::vector<IndexLink>& links, const std::string& file) {
+    for (const auto& link : links)
+        AddCustomLink(link.caption, link.keyword, file, link.bookmark);
 }
 
 std::string clsHHK::TruncateCaption(const std::string& text) {

@@ -10,6 +10,7 @@
 namespace tovimar {
 
 class CXmlForm;
+struct IndexLink;
 
 /// One `param` line of an index entry.
 class clsHHKObjectParameter {
@@ -73,6 +74,8 @@ public:
                        const std::string& vstrGeneratedFileName, const std::string& vstrBookmarkName);
     /// The keywords of an object, its documented controls and menus. The file is that of the definition.
     void AddXmlFormLinks(const CXmlForm& rxmlForm, const std::string& vstrGeneratedHtmlFile);
+    /// Links that were taken from a definition; the file is its topic's.
+    void AddLinks(const std::vector<IndexLink>& links, const std::string& file);
     /// The text of the index file; with `FillIndexFromAppObjectsAndControls` off an empty list.
     std::string HHKContents() const;
     void Terminate();
@@ -83,9 +86,6 @@ public:
     static std::string TruncateCaption(const std::string& text);
 
 private:
-    struct Source;
-    void AddControlLinks(const CXmlForm& form, const Source& source, const std::string& formCaption,
-                         const std::string& file);
     std::unique_ptr<clsHHKObject> root_;
 };
 
