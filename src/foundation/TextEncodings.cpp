@@ -60,10 +60,12 @@ struct Rules {
     bool moreCyrillic;
     /// Named entities in their numeric form.
     bool namesToNumbers;
+    /// What looks like an entity is text as well.
+    bool everyMark = false;
 };
 
 /// Copies an entity at `position`, which moves behind it; false when none stands there.
-bool CopyEntity(const std::string& text, std::size_t& position, std::string& out, const Rules& rules) {
+bool CopyEntity(std::string_view text, std::size_t& position, std::string& out, const Rules& rules) {
     const std::string_view candidate = CandidateAt(text, position);
     if (candidate.empty())
         return false;
@@ -79,44 +81,59 @@ bool CopyEntity(const std::string& text, std::size_t& position, std::string& out
     return true;
 }
 
+/// Viewers take the number of a reference for Unicode. A letter of the page whose value is another
+/// character's number there stays a letter: "&#179;" for the Polish "l" with stroke would show a small three.
 bool KeepsLetter(char32_t codePoint, int value, const Rules& rules) {
     if (IsIn(value, 128, 173) || IsIn(value, 225, 239))
         return true;
     const bool cyrillic =
         IsRussianLetter(codePoint) ||
         (rules.moreCyrillic && (value == 175 || value == 179 || value == 185 || value == 191));
-    return cyrillic && !rules.cyrillicAsEntity;
+    if (cyrillic)
+        return !rules.cyrillicAsEntity;
+    return value >= 128 && static_cast<char32_t>(value) != codePoint;
 }
 
-std::string Encode(const std::string& text, const Rules& rules) {
+/// Behind the characters that stay as they are.
+std::size_t SkipKept(std::string_view text, std::size_t position) {
+    while (position < text.size() && text::IsAscii(text[position]) &&
+           kKept[static_cast<unsigned char>(text[position])])
+        ++position;
+    return position;
+}
+
+void Append(std::string& out, std::string_view text, const Rules& rules) {
     const text::CodePage& page = text::AnsiCodePage();
-    std::string out;
-    out.reserve(text.size() + text.size() / 8);
     for (std::size_t i = 0; i < text.size();) {
         const std::size_t start = i;
-        if (text[i] == '&' && CopyEntity(text, i, out, rules))
+        i = SkipKept(text, i);
+        out.append(text, start, i - start);
+        if (i == text.size())
+            return;
+        const std::size_t at = i;
+        if (text[i] == '&' && !rules.everyMark && CopyEntity(text, i, out, rules))
             continue;
         const char32_t codePoint = text::NextCodePoint(text, i);
         if (codePoint < 128) {
-            if (kKept[codePoint] || (codePoint == ';' && rules.keepSemicolon))
-                out += text[start];
+            if (codePoint == ';' && rules.keepSemicolon)
+                out += ';';
             else
                 AppendReference(out, codePoint);
             continue;
         }
         const int value = page.AnsiValue(codePoint);
-        const bool known = value >= 128;
         if (KeepsLetter(codePoint, value, rules))
-            out.append(text, start, i - start);
+            out.append(text, at, i - at);
         else
-            AppendReference(out, known ? static_cast<char32_t>(value) : codePoint);
+            AppendReference(out, codePoint);
     }
-    return out;
 }
 
-/// Every "&" as its reference, which both encoders leave alone.
-std::string WithReferredMarks(const std::string& name) {
-    return text::ReplaceAll(name, "&", "&#38;");
+std::string Encode(const std::string& text, const Rules& rules) {
+    std::string out;
+    out.reserve(text.size() + text.size() / 8);
+    Append(out, text, rules);
+    return out;
 }
 
 /// Character of a decimal reference "&#39;"; 0 for one that has none.
@@ -167,11 +184,21 @@ std::string EncodeXmlText(const std::string& text, bool rfCyrillicAsEntity) {
 }
 
 std::string EncodeXmlName(const std::string& name) {
-    return EncodeXmlText(WithReferredMarks(name));
+    return Encode(name, {false, true, true, true, /*everyMark=*/true});
 }
 
 std::string EncodeSpecialName(const std::string& name) {
-    return EncodeSpecialChars(WithReferredMarks(name));
+    std::string out;
+    AppendSpecialName(out, name);
+    return out;
+}
+
+void AppendSpecialChars(std::string& out, std::string_view text) {
+    Append(out, text, {false, false, false, false});
+}
+
+void AppendSpecialName(std::string& out, std::string_view name) {
+    Append(out, name, {false, false, false, false, /*everyMark=*/true});
 }
 
 std::string DecodeHtmlEntities(const std::string& text) {

@@ -1,12 +1,13 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 
 /// Escaping of texts for XML attributes and HTML, and back. All are linear in the text.
 ///
-/// Both encoders keep plain letters, digits and most punctuation and write everything else as `&#n;`, where n
-/// is the character's value in the ANSI code page, or its code point when the page doesn't have it. An
-/// entity that already stands in the text isn't encoded again.
+/// Both encoders keep plain letters, digits and most punctuation, and the letters of an ANSI code page whose
+/// value there isn't their code point. Everything else is written as `&#n;` with the code point, so that
+/// every reader of HTML shows it. An entity that already stands in the text isn't encoded again.
 namespace tovimar {
 
 /// For settings and catalogue. `vfCyrillicAsEntity` writes Russian letters as numbers too. Entities are
@@ -21,6 +22,9 @@ std::string EncodeXmlText(const std::string& text, bool rfCyrillicAsEntity = fal
 std::string EncodeXmlName(const std::string& name);
 /// `EncodeSpecialChars` for a name.
 std::string EncodeSpecialName(const std::string& name);
+/// The same two behind a text that is being built, for writers of many values.
+void AppendSpecialChars(std::string& out, std::string_view text);
+void AppendSpecialName(std::string& out, std::string_view name);
 
 /// Entities become characters: first every "&amp;", then all named ones, then the numeric ones. Names are
 /// looked up as written, then without regard to case. Numbers 128 to 159 are taken from the ANSI code page.
