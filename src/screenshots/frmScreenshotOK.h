@@ -1,6 +1,6 @@
 #pragma once
 
-#include "screenshots/DialogControls.h"
+#include "foundation/DialogControls.h"
 
 #include <functional>
 #include <string>

@@ -1,6 +1,8 @@
 #pragma once
 
+#include <cstdint>
 #include <string>
+#include <vector>
 
 /// What a window shows of a dialog: values go in and out, the dialog sets the rest.
 namespace tovimar::dialog {
@@ -24,6 +26,18 @@ struct OptionButton : Control {
 struct TextBox : Control {
     std::string text = {};
     bool widened = false; ///< takes the space of the hidden button beside it
+};
+
+/// A list with at most one selected entry.
+struct ListBox : Control {
+    std::vector<std::string> entries = {};
+    std::int32_t selected = -1; ///< from 0; -1 is none
+    bool widened = false;       ///< takes the space of hidden controls above it
+
+    std::string SelectedEntry() const {
+        const bool any = selected >= 0 && static_cast<std::size_t>(selected) < entries.size();
+        return any ? entries[static_cast<std::size_t>(selected)] : std::string();
+    }
 };
 
 struct Button : Control {};
