@@ -100,6 +100,13 @@ void CAddInProjects::Remove(std::size_t position) {
     list.TakeAt(position);
 }
 
+bool CAddInProjects::Forget(const std::string& vstrTVPFullPath) {
+    const std::size_t position = Projects().PositionOf(vstrTVPFullPath);
+    if (position > 0)
+        Remove(position);
+    return position > 0;
+}
+
 void CAddInProjects::RemoveTempProjects() {
     for (std::size_t i = Projects().Count(); i > 0; --i)
         if (list_.At(i)->IsNew)

@@ -42,6 +42,9 @@ public:
     /// Raises 0x80040001 when none is free.
     std::string GetUniqueProjectName(const std::string& vstrSourceProjectName);
     bool ChangeCurrentProjectName(const std::string& vstrNewName);
+    /// Takes a project out of the list, by the path of its project file; its files stay, and `Save` writes the
+    /// list. False when it isn't listed.
+    bool Forget(const std::string& vstrTVPFullPath);
     /// Drops every project that was never saved.
     void RemoveTempProjects();
     std::int32_t Count();
