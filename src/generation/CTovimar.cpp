@@ -10,15 +10,19 @@
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimarCompiler.h"
 #include "generation/HelpUtilities.h"
+#include "generation/IHelpWizardForm.h"
 #include "generation/RunProgress.h"
 #include "generation/clsFrmRptHelpContextIds.h"
 #include "generation/clsHtmlHelp.h"
 #include "host/access/CHelpPrjTreeCF.h"
 #include "host/contract/IHelpPrjSourceProject.h"
+#include "host/contract/ObjectTypes.h"
+#include "host/server/CTovimarServer.h"
 #include "host/server/CTovimarServerAgent.h"
 #include "host/server/CTovimarServerData.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
+#include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
 #include "project/clsHHK.h"
@@ -34,6 +38,11 @@ bool Interrupted() {
 
 bool FileExists(const std::string& path) {
     return !path.empty() && platform::Env().files->FileExists(path);
+}
+
+/// A program without windows has none, and then asks nothing about it.
+bool HasEditor() {
+    return Session::Server() != nullptr && Session::Server()->MakeHelpEditorForm;
 }
 
 constexpr const char* kErrorsQuestion =
@@ -109,7 +118,7 @@ void CTovimar::Generate() {
                         parameters_->OpenHTMLHelp, /*vfRegenerate=*/false);
 }
 
-void CTovimar::GenerateHelpProject(bool vfCompile, bool /*vfBackup*/, bool vfSaveChanges, bool vfOpenHelp,
+void CTovimar::GenerateHelpProject(bool vfCompile, bool vfBackup, bool vfSaveChanges, bool vfOpenHelp,
                                    bool vfRegenerate) {
     RunPaths paths;
     int step = 0;
@@ -127,6 +136,8 @@ void CTovimar::GenerateHelpProject(bool vfCompile, bool /*vfBackup*/, bool vfSav
             run.generationInterrupted = false;
             run.runErrorCount = 0;
             step = 1;
+            if (vfBackup)
+                MakeBackupForFolder(paths.folder);
             GenerateHTMLForProject(vfCompile, vfRegenerate);
             if (!run.generationInterrupted && run.runErrorCount == 0)
                 CompleteGeneration(paths, vfSaveChanges, vfOpenHelp, step);
@@ -158,7 +169,10 @@ void CTovimar::CompleteGeneration(RunPaths& paths, bool vfSaveChanges, bool vfOp
     RunData().ProgressBarUpdate("Saving changes of the source project", 2);
     host.SaveMakeRun(vfSaveChanges, /*makeApp=*/false, /*runApp=*/false);
     step = 4;
-    if (vfOpenHelp && FileExists(paths.compiledFile)) {
+    if (vfOpenHelp &&
+        text::EqualsIgnoringCase(host.CurrentSourceProjectTypeName(), SourceProjectKind::kAspNet)) {
+        Session::Server()->OpenWebHelpOfActiveProject();
+    } else if (vfOpenHelp && FileExists(paths.compiledFile)) {
         RunData().ProgressBarUpdate("Opening generated and compiled HTML help...", 3);
         RunData().HtmlHelp().OpenTOC(paths.compiledFile, 0);
     }
@@ -167,7 +181,7 @@ void CTovimar::CompleteGeneration(RunPaths& paths, bool vfSaveChanges, bool vfOp
 }
 
 void CTovimar::OfferEditorAfterErrors() {
-    if (!OpenHelpEditor)
+    if (!HasEditor())
         return;
     const int answer = ShowMessage(kErrorsQuestion, kMsgYesNo | kMsgDefaultSecond, kApplicationTitle);
     if (answer != platform::kAnswerYes)
@@ -180,11 +194,12 @@ void CTovimar::OfferEditorAfterErrors() {
 }
 
 void CTovimar::OpenEditor() {
-    if (!OpenHelpEditor)
+    if (!HasEditor())
         return;
     platform::Env().doEvents();
     RunData().ProgressBarUpdate("Opening HTML help editor form...", 4);
-    OpenHelpEditor();
+    Session::Server()->OpenHelpEditorForm();
+    Session::Server()->SetFocusToHTMLEditor();
 }
 
 ResultCode CTovimar::GenerateHTMLForProject(bool /*vfCompile*/, bool vfRegenerate) {
@@ -294,7 +309,7 @@ ResultCode CTovimar::CreateHHCandHHKFiles() {
     return trapped != kSuccess ? trapped : result;
 }
 
-ResultCode CTovimar::LoadTreviewForActiveProject(bool vfSkipIfLoaded) {
+ResultCode CTovimar::LoadTreviewForActiveProject(bool vfSkipIfLoaded, const IHelpWizardForm* objWizard) {
     if (vfSkipIfLoaded && tree_ != nullptr && tree_->Root() != nullptr)
         return kSuccess;
     ResultCode result = kSuccess;
@@ -314,7 +329,7 @@ ResultCode CTovimar::LoadTreviewForActiveProject(bool vfSkipIfLoaded) {
         if (!contents.empty() && FileExists(file))
             result = LoadProjectFile(file, !FileExists(contents));
         else
-            LoadNewProject(!contents.empty() || !file.empty());
+            LoadNewProject(!contents.empty() || !file.empty(), objWizard);
     });
     return trapped != kSuccess ? trapped : result;
 }
@@ -326,13 +341,19 @@ ResultCode CTovimar::LoadProjectFile(const std::string& path, bool newProject) {
                                   /*vfLoadControls=*/true);
 }
 
-void CTovimar::LoadNewProject(bool hasPaths) {
+void CTovimar::LoadNewProject(bool hasPaths, const IHelpWizardForm* wizard) {
+    // Between the steps the user may have closed the wizard that shows the tree.
+    const auto closed = [wizard] { return wizard != nullptr && !wizard->Visible(); };
     std::unique_ptr<IHelpPrjSourceProject> source;
+    if (closed())
+        return;
     {
         HostMeter meter("Parsing source project...", 2);
         meter.Update(1);
         source = HostAgent().ParseSourceProject();
     }
+    if (closed())
+        return;
     {
         HostMeter meter("Loading TOC treeview...", 2);
         meter.Update(1);
@@ -342,6 +363,8 @@ void CTovimar::LoadNewProject(bool hasPaths) {
         HelpProjectTree().Load(initial, /*vfNewHtmlHelpProject=*/true, /*vfLoadingExternalProject=*/false,
                                /*vstrXml=*/{}, /*vfLoadControls=*/true);
     }
+    if (closed())
+        return;
     HostMeter meter("Expanding serializer nodes...", 2);
     meter.Update(1);
     CHelpPrjTreeCF factory;

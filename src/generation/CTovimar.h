@@ -13,6 +13,7 @@ namespace tovimar {
 class CHelpPrjTree;
 class CHelpPrjTreeNode;
 class CXmlForm;
+class IHelpWizardForm;
 class clsFrmRptHelpContextIds;
 class clsHHK;
 
@@ -47,7 +48,9 @@ public:
 
     /// Loads the tree of the current project: its file when it stands, else the contents template with the
     /// objects of the source project. 0, or 0x8003FE09 for a stopped run, or the tree's failure.
-    ResultCode LoadTreviewForActiveProject(bool vfSkipIfLoaded = false);
+    /// The steps of a new project end silently once the window of `objWizard` isn't visible any more.
+    ResultCode LoadTreviewForActiveProject(bool vfSkipIfLoaded = false,
+                                           const IHelpWizardForm* objWizard = nullptr);
     void UnLoadTreviewForActiveProject();
 
     CTovimarParameters& Parameters() { return *parameters_; }
@@ -82,9 +85,6 @@ public:
                                                      const std::string& htmlFullPath, bool vfPreviewAreaOnly,
                                                      const std::string& sourceTypeName, bool vfKeepOpened);
 
-    /// Shows the help editor on the tree; none in a program without windows, which then asks nothing about
-    /// it.
-    std::function<void()> OpenHelpEditor;
     /// Called for every node of a pass before it is made; not for placeholders, which make nothing.
     std::function<void(const NodeProgress&)> NodeStarted;
     /// Called before the help compiler runs.
@@ -103,7 +103,7 @@ private:
     void OpenEditor();
     ResultCode CompileAndCopy();
     ResultCode LoadProjectFile(const std::string& path, bool newProject);
-    void LoadNewProject(bool hasPaths);
+    void LoadNewProject(bool hasPaths, const IHelpWizardForm* wizard);
 
     std::unique_ptr<CTovimarParameters> parameters_;
     std::unique_ptr<clsHHK> helpIndex_;

@@ -9,10 +9,10 @@
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimar.h"
-#include "generation/CTovimarCompiler.h"
 #include "generation/CTovimarParameters.h"
 #include "generation/CTovimarStats.h"
 #include "generation/HelpUtilities.h"
+#include "generation/IHelpWizardForm.h"
 #include "generation/RunProgress.h"
 #include "generation/clsHtmlHelp.h"
 #include "host/contract/ObjectTypes.h"
@@ -24,6 +24,7 @@
 #include "platform/xml/XmlDocument.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
+#include "screenshots/clsScreenshotOptions.h"
 
 #include <algorithm>
 #include <utility>
@@ -66,97 +67,76 @@ void SkipKindsThatAreOff(CHelpPrjTreeNode& node, const CTovimarParameters& param
         SkipKindsThatAreOff(*child, parameters);
 }
 
-/// A compiled help doesn't open from a folder with these characters.
-bool UserWantsOtherFolder(const std::string& folder) {
-    const char* character = folder.find('%') != std::string::npos   ? "%"
-                            : folder.find('#') != std::string::npos ? "#"
-                                                                    : nullptr;
-    if (character == nullptr)
-        return false;
-    const std::string question =
-        "Target folder '" + folder + "' contains character '" + character +
-        "'\r\nA help file (.chm) will not work correctly in folders with that character.\r\n"
-        "Do you want to select another target folder?";
-    return ShowMessage(question, kMsgYesNo | kMsgQuestion | kMsgDefaultSecond, kApplicationTitle) ==
-           platform::kAnswerYes;
-}
-
-bool UserStopsOverLockedHelp() {
-    CTovimarCompiler compiler;
-    if (compiler.TestHelpFileWritable())
-        return false;
-    const std::string question = "Can't copy over existing help file " + compiler.GetCopiedHelpFullPath() +
-                                 "\r\nClose it if it's opened in HTML Help window,\r\n"
-                                 "then click [OK] button to continue help generation or\r\n"
-                                 "click [Cancel] button to stop help generation.";
-    return ShowMessage(question, kMsgOkCancel | kMsgExclamation, kApplicationTitle) ==
-           platform::kAnswerCancel;
-}
-
-bool NameIsTaken(const std::string& name) {
-    auto* project = Session::Projects()->ProjectExists(name + ".tvp");
-    if (project == nullptr || project->IsNew || !FileExists(project->TvpFullPath()))
-        return false;
-    ShowMessage("Tovimar project already exists '" + name + "'.\r\nPlease enter another project name.",
-                kMsgOk, kApplicationTitle);
-    return true;
+bool Lists(const KeyedList<std::string>& names, const std::string& wanted) {
+    for (const std::string& name : names)
+        if (text::EqualsIgnoringCase(name, wanted))
+            return true;
+    return false;
 }
 
 } // namespace
 
+CTovimarActions::CTovimarActions() = default;
+
+CTovimarActions::~CTovimarActions() {
+    Terminate();
+}
+
+// The screenshot options are made at their first read: the settings load later.
+void CTovimarActions::Init() {
+    terminated_ = false;
+}
+
+void CTovimarActions::Terminate() {
+    if (terminated_)
+        return;
+    terminated_ = true;
+    PassOver([this] { DropWizard(); });
+    closedWizard_.reset();
+    screenshotOptions_.reset();
+}
+
 bool CTovimarActions::PrepareProject(const GenerationRequest& request) {
     bool prepared = false;
-    Trapped(kClass, "OpenWizardForm", [&] {
-        std::string name;
-        std::string usable;
-        int count = 0;
-        if (!FindSourceProjects(name, usable, count))
+    Trapped(kClass, "PrepareProject", [&] {
+        SourceProjects projects;
+        if (!ListSourceProjects(projects) || !FindUsableProjects(projects))
             return;
-        auto& catalogue = *Session::Projects();
-        catalogue.RemoveTempProjects();
-        auto project = std::make_unique<CAddInProject>();
-        project->Name = request.projectName.empty() ? name : request.projectName;
-        project->SourceProjectFullPath = HostAgent().CurrentSourceProjectFullPath();
-        if (project->SourceProjectFullPath.empty()) {
-            WarningDialog("Can't get unique help project name for source project '" + name + "'.");
+        Session::Projects()->RemoveTempProjects();
+        auto project =
+            NewProject(projects, request.projectName.empty() ? projects.current : request.projectName);
+        if (project == nullptr)
             return;
-        }
-        project->HasSeveralSourceProjects = count > 1;
-        project->SetSourceProjectsList(count > 1 ? usable : std::string());
-
         auto& parameters = *Session::Parameters();
         parameters.SetFolderForGeneratedHelp(request.folder);
         TakeOverEarlierProject(*project);
-        catalogue.SetCurrentProject(std::move(project));
-        parameters.ApplicationNameStr =
-            request.application.empty() ? RunData().NewTovimarProjectTitle() : request.application;
-        parameters.SetHelpProjectName(catalogue.CurrentProject()->Name);
+        MakeTemporaryProject(projects, std::move(project));
+        if (!request.application.empty())
+            parameters.ApplicationNameStr = request.application;
         parameters.SetHelpProjectTitle(request.title.empty() ? parameters.ApplicationNameStr : request.title);
         prepared = true;
     });
     return prepared;
 }
 
-bool CTovimarActions::FindSourceProjects(std::string& name, std::string& usable, int& count) {
+bool CTovimarActions::ListSourceProjects(SourceProjects& projects) {
+    projects.listed = HostAgent().GetSourceProjectsList();
+    if (!projects.listed.Empty())
+        return true;
+    ShowMessage("No Projects!", kMsgExclamation, kApplicationTitle, {}, 0, "CTovimarActions.OpenWizardForm");
+    return false;
+}
+
+bool CTovimarActions::FindUsableProjects(SourceProjects& projects) {
     auto& host = HostAgent();
-    const auto list = host.GetSourceProjectsList();
-    if (list.Empty()) {
-        ShowMessage("No Projects!", kMsgExclamation, kApplicationTitle, {}, 0,
-                    "CTovimarActions.OpenWizardForm");
-        return false;
-    }
-    name = host.CurrentSourceProjectName();
-    std::vector<std::string> names;
-    for (const std::string& listed : list)
-        names.push_back(listed);
-    if (std::none_of(names.begin(), names.end(),
-                     [&](const std::string& listed) { return text::EqualsIgnoringCase(listed, name); })) {
+    const std::string name = projects.current = host.CurrentSourceProjectName();
+    if (!Lists(projects.listed, name)) {
         WarningDialog("Source project '" + name +
-                      "' not found in the list of available source projects:\r\n" + text::Join(names, "|"));
+                      "' not found in the list of available source projects:\r\n" +
+                      concatProjectsListFromCollection(projects.listed));
         return false;
     }
-    std::vector<std::string> found;
-    for (const std::string& listed : names) {
+    for (const std::string& listed : projects.listed) {
         host.SetCurrentSourceProject(listed);
         const std::string path = host.CurrentSourceProjectFullPath();
         TraceText([&] {
@@ -164,12 +144,42 @@ bool CTovimarActions::FindSourceProjects(std::string& name, std::string& usable,
                    ", FullPath = " + path;
         });
         if (!path.empty())
-            found.push_back(listed);
+            projects.usable.Add(listed);
     }
     host.SetCurrentSourceProject(name);
-    usable = text::Join(found, "|");
-    count = static_cast<int>(found.size());
     return true;
+}
+
+std::unique_ptr<CAddInProject> CTovimarActions::NewProject(const SourceProjects& projects,
+                                                           const std::string& name) {
+    auto project = std::make_unique<CAddInProject>();
+    project->Name = name;
+    project->SourceProjectFullPath = HostAgent().CurrentSourceProjectFullPath();
+    if (!project->SourceProjectFullPath.empty())
+        return project;
+    WarningDialog("Can't get unique help project name for source project '" + projects.current + "'.");
+    return nullptr;
+}
+
+/// The current project until a run saves it.
+void CTovimarActions::MakeTemporaryProject(const SourceProjects& projects,
+                                           std::unique_ptr<CAddInProject> project) {
+    project->HasSeveralSourceProjects = projects.usable.Count() > 1;
+    project->SetSourceProjectsList(project->HasSeveralSourceProjects
+                                       ? concatProjectsListFromCollection(projects.usable)
+                                       : std::string());
+    const auto& current = Session::Projects()->SetCurrentProject(std::move(project));
+    auto& parameters = *Session::Parameters();
+    parameters.ApplicationNameStr = RunData().NewTovimarProjectTitle();
+    parameters.SetHelpProjectName(current.Name);
+    parameters.SetHelpProjectTitle(parameters.ApplicationNameStr);
+}
+
+std::string CTovimarActions::concatProjectsListFromCollection(const KeyedList<std::string>& rcol) {
+    std::vector<std::string> names;
+    for (const std::string& name : rcol)
+        names.push_back(name);
+    return text::Join(names, "|");
 }
 
 /// The identifiers of a project outlive its being made anew; its catalogue entry comes back with the run's
@@ -196,81 +206,58 @@ void CTovimarActions::TakeOverEarlierProject(CAddInProject& project) {
     }
 }
 
-ResultCode CTovimarActions::CheckIfGenerationPossible() {
-    auto& files = *platform::Env().files;
-    const std::string folder = Session::Parameters()->FolderForGeneratedHelp();
-    const std::string target = "Target folder '" + folder + "'\r\n";
-    if (UserWantsOtherFolder(folder))
-        return kOtherFolder;
-    if (files.FolderExists(folder))
-        for (const std::string& file : files.ListFiles(folder, "*.tvp"))
-            if (!text::EqualsIgnoringCase(file, earlierProjectFile_)) {
-                WarningDialog(target + "already has Tovimar project '" + file +
-                              "'.\r\n\r\nPlease select another target folder.");
-                return kOtherFolder;
-            }
-    if (!CreateFolderPath(folder)) {
-        WarningDialog(target + " cannot be created.\r\nPlease select or enter another target folder name.");
-        return kNoFolder;
-    }
-    if (!TestFolderWritable(folder)) {
-        WarningDialog(target + " is no write access.\r\nPlease select or enter another target folder name.");
-        return kNoWriteAccess;
-    }
-    if (NameIsTaken(Session::Parameters()->HelpProjectName()))
-        return kNameTaken;
-    return UserStopsOverLockedHelp() ? kHelpFileLocked : kSuccess;
-}
-
-CTovimarActions::Outcome CTovimarActions::GenerateFromOptions() {
+CTovimarActions::Outcome CTovimarActions::GenerateFromOptions(bool checked) {
     auto outcome = Outcome::Refused;
-    Trapped(kClass, "ProcessWizardFormClosing", [&] {
-        {
+    Trapped(kClass, "GenerateFromOptions", [&] {
+        if (!checked) {
             const Hourglass hourglass;
             const HostMeter meter("Checking help generation options...", 2);
             if (CheckIfGenerationPossible() != kSuccess)
                 return;
         }
         outcome = Outcome::Cancelled;
+        TakeRunOptions();
         LoadTree();
+        CompleteTree();
         outcome = RunGeneration();
     });
-    // A stopped run answers all commands without reaching the host: meter and pointer only go now.
-    auto& run = Session::Run();
-    run.generationInProgress = false;
-    run.generationInterrupted = false;
-    PassOver([] {
-        HostAgent().ResetIDEWindows();
-        HostAgent().ProgressMeterRemove();
-        HostAgent().HourglassOffFinal();
-    });
+    EndRun(/*begun=*/true);
     return outcome;
 }
 
-void CTovimarActions::LoadTree() {
+void CTovimarActions::TakeRunOptions() {
     auto& parameters = *Session::Parameters();
-    auto& generator = *Session::Generator();
     parameters.LastUsedFolderForGeneratedHelp = parameters.FolderForGeneratedHelp();
     parameters.LastUsedFolderForCapturedImages = parameters.FolderForGeneratedImages();
     parameters.HotSpots = parameters.AddHotSpotsForForm;
     parameters.NoReportsScreenShots = !parameters.AddImageForReport;
     Session::CurrentProject()->Folder = parameters.LastUsedFolderForGeneratedHelp;
+}
 
+/// A fresh tree whose groups follow the options; the wizard's user has set them in the tree itself.
+void CTovimarActions::LoadTree() {
+    auto& parameters = *Session::Parameters();
+    auto& generator = *Session::Generator();
     // The web help's entry page is written last; one of an earlier run would count among the pages.
     const std::string entryPage = parameters.FolderForGeneratedHelp() + "main.htm";
     if (!earlierProjectFile_.empty() && FileExists(entryPage))
         platform::Env().files->DeleteFile(entryPage);
     generator.UnLoadTreviewForActiveProject();
     generator.LoadTreviewForActiveProject(/*vfSkipIfLoaded=*/true);
-    auto* root = generator.HelpProjectTree().Root();
+    if (auto* root = generator.HelpProjectTree().Root())
+        SkipKindsThatAreOff(*root, parameters);
+}
+
+void CTovimarActions::CompleteTree() {
+    auto& tree = Session::Generator()->HelpProjectTree();
+    auto* root = tree.Root();
     if (root == nullptr)
         throw RaisedError(kFailure1, "The contents template of the installation can't be loaded", kClass);
-    SkipKindsThatAreOff(*root, parameters);
-    generator.HelpProjectTree().SyncGenerateFlagsFromTree();
+    tree.SyncGenerateFlagsFromTree();
     if (auto* settings = Session::Settings())
         settings->CopyToOptions();
     if (root->HtmlTitle().empty())
-        root->SetHtmlTitle(parameters.HelpProjectTitle());
+        root->SetHtmlTitle(Session::Parameters()->HelpProjectTitle());
     RunData().HtmlHelp().CloseAll();
     HostAgent().HourglassOn();
     HostAgent().HideIDEWindows();
@@ -286,6 +273,8 @@ CTovimarActions::Outcome CTovimarActions::RunGeneration() {
         run.generationInProgress = false;
     }
     if (run.generationInterrupted) {
+        HostAgent().ProgressMeterRemove();
+        HostAgent().HourglassOffFinal();
         ShowMessage("Help generation was cancelled by end-user.", kMsgCritical, kApplicationTitle);
         return Outcome::Cancelled;
     }
@@ -294,6 +283,20 @@ CTovimarActions::Outcome CTovimarActions::RunGeneration() {
                 kMsgInformation, "Help Generation Completed", {}, 0,
                 "CTovimarActions.ProcessWizardFormClosing");
     return Outcome::Completed;
+}
+
+/// A stopped run answers all commands without reaching the host: meter and pointer only go now.
+void CTovimarActions::EndRun(bool begun) {
+    auto& run = Session::Run();
+    run.generationInProgress = false;
+    run.generationInterrupted = false;
+    PassOver([begun] {
+        if (begun) {
+            HostAgent().ResetIDEWindows();
+            HostAgent().ProgressMeterRemove();
+        }
+        HostAgent().HourglassOffFinal();
+    });
 }
 
 std::string CTovimarActions::SummaryText(const CTovimarStats& stats,

@@ -37,6 +37,8 @@ std::vector<std::string> PictureFiles(CAddInProject& project) {
     const std::string folder = project.PicsSubfolderPath();
     const std::string prefix = platform::WithTrailingBackslash(project.PicsSubfolderName);
     std::vector<std::string> pictures;
+    if (!platform::Env().files->FolderExists(folder))
+        return pictures;
     for (const char* pattern : {"*.bmp", "*.jpg"})
         for (const std::string& file : platform::Env().files->ListFiles(folder, pattern))
             pictures.push_back(prefix + file);

@@ -34,10 +34,6 @@ std::string FileNameInProject(std::int32_t type, const std::string& name) {
 
 } // namespace
 
-CTovimarActions::CTovimarActions() = default;
-
-CTovimarActions::~CTovimarActions() = default;
-
 clsScreenshotOptions& CTovimarActions::ScreenshotOptions() {
     if (screenshotOptions_ == nullptr) {
         screenshotOptions_ = std::make_unique<clsScreenshotOptions>();
@@ -111,6 +107,8 @@ bool CTovimarActions::TakeScreenshot(std::int32_t type, const std::string& name)
             dialog.SetURL(topic.empty() ? picture : topic);
             dialog.SetRecompileButtonVisible(!options.UserControlledScreenshotLocation);
             frmScreenshotOK::ShowDialog(dialog);
+            if (dialog.OK())
+                RecompileHelpProject();
         }
     });
     return taken;

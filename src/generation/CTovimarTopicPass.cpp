@@ -164,6 +164,7 @@ void MakeListPage(CHelpPrjTreeNode& node, const CTovimarParameters& parameters) 
     ReplaceTagsAndCopy(source, node.GeneratedHTMLFileFullPath(), tags);
 }
 
+/// What the object before has cost.
 void TraceInterval(Walk& walk) {
     TraceText([&] {
         const double now = platform::Env().clock->Timer();
@@ -176,13 +177,16 @@ void TraceInterval(Walk& walk) {
 
 void MakeObjectTopic(CHelpPrjTreeNode& node, Walk& walk) {
     ObjectTopic topic(walk.generator, node);
+    const bool exists = topic.Find();
+    TraceInterval(walk);
+    if (!exists)
+        return;
     try {
         topic.Make();
     } catch (...) {
         walk.savingDetail = topic.SavingDetail();
         throw;
     }
-    TraceInterval(walk);
 }
 
 void MakeNode(CHelpPrjTreeNode& node, Walk& walk) {

@@ -3,6 +3,7 @@
 #include "foundation/CUTF8FileReader.h"
 #include "foundation/CUTF8FileWriter.h"
 #include "foundation/CXmlMessages.h"
+#include "foundation/ErrorTrap.h"
 #include "foundation/Product.h"
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
@@ -10,7 +11,10 @@
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
+#include "project/CHelpPrjTreeNode.h"
+#include "project/ITreeView.h"
 
+#include <array>
 #include <optional>
 #include <utility>
 
@@ -64,48 +68,66 @@ std::string ReplaceTagsAndCopy(const std::string& vstrTemplateFullPath, const st
     return page;
 }
 
-bool CreateFolderPath(const std::string& vstrPath) {
-    try {
-        platform::Env().files->MakeFolders(vstrPath);
-        return true;
-    } catch (const RaisedError&) {
-        return false;
-    }
+std::int32_t GetTreeIconIndex(const std::string& vstrKey) {
+    constexpr std::array<const char*, 7> kImages{"hlpclose",  "no",   "openedBook", "document",
+                                                 "document1", "form", "report"};
+    for (std::size_t i = 0; i < kImages.size(); ++i)
+        if (text::EqualsIgnoringCase(vstrKey, kImages[i]))
+            return static_cast<std::int32_t>(i);
+    return 0;
 }
 
-bool TestFolderWritable(const std::string& vstrFolder) {
-    auto& files = *platform::Env().files;
-    const std::string probe = platform::Join(vstrFolder, "test.txt");
-    try {
-        // Somebody's own file of that name is only opened.
-        const bool taken = files.FileExists(probe);
-        files.AppendFile(probe, {});
-        if (!taken)
-            files.DeleteFile(probe);
-        return true;
-    } catch (const RaisedError&) {
-        return false;
-    }
+void SetTreeNodeIcon(CHelpPrjTreeNode& node) {
+    if (node.TreeViewNode == nullptr)
+        return;
+    const char* image = node.TreeViewNode->Expanded() ? "openedBook" : "hlpclose";
+    if (node.Children().Empty())
+        image = "helptopic";
+    node.TreeViewNode->SetImage(node.Skipped() ? "no" : image);
 }
 
-std::int32_t ShellExecute(const std::string& file, const std::string& /*verb*/, const std::string& parameters,
-                          bool vfWait) {
-    constexpr std::int32_t kDone = 42;
-    constexpr std::int32_t kNoProgram = 31;
-    if (!vfWait && parameters.empty())
-        return platform::Env().processes->Open(file) ? kDone : kNoProgram;
-    const ResultCode result =
-        ShellAndWait("\"" + file + "\"" + (parameters.empty() ? "" : " " + parameters), 1);
-    return result == kSuccess ? kDone : result;
+bool IsFormModuleName(const std::string& vstrName) {
+    return text::StartsWithIgnoringCase(vstrName, "Form_");
 }
 
-ResultCode ShellAndWait(const std::string& command, std::int32_t /*windowStyle*/) {
-    try {
-        platform::Env().processes->RunAndWait(command);
-        return kSuccess;
-    } catch (const RaisedError& failure) {
-        return failure.Number();
-    }
+bool IsReportModuleName(const std::string& vstrName) {
+    return text::StartsWithIgnoringCase(vstrName, "Report_");
+}
+
+bool IsFormOrReportModuleName(const std::string& vstrName) {
+    return IsFormModuleName(vstrName) || IsReportModuleName(vstrName);
+}
+
+std::string GetZoomStyleHtml(const std::string& vstrPercent) {
+    if (vstrPercent.empty())
+        return {};
+    return "<style type=\"text/css\" media=\"screen\">\r\nbody {zoom: " + vstrPercent + "}\r\n</style>\r\n";
+}
+
+std::string ShortenCaption(const std::string& vstrText) {
+    constexpr std::size_t kLongest = 32;
+    return text::Length(vstrText) > kLongest ? text::Left(vstrText, kLongest) + "..." : vstrText;
+}
+
+std::vector<std::string> SplitToList(const std::string& vstrText) {
+    return vstrText.empty() ? std::vector<std::string>() : text::Split(vstrText, "|");
+}
+
+bool SetRelativePath(const std::string& vstrPath) {
+    bool changed = false;
+    Trapped("modTovimarUtils", "SetRelativePath", [&] {
+        const std::string folder = platform::FolderOf(vstrPath);
+        CUTF8FileReader reader;
+        if (folder.empty() || reader.LoadFile(vstrPath) != kSuccess ||
+            !text::ContainsIgnoringCase(reader.Text(), folder))
+            return;
+        std::string page = reader.Text();
+        for (const char* scheme : {"file:///", "file://", ""})
+            page = text::ReplaceAllIgnoringCase(page, scheme + folder, "");
+        changed = CUTF8FileWriter().SaveFile(vstrPath, page, reader.HasUTF8Header(),
+                                             /*vfSaveAsUsualTextFileIfNotUTF8=*/!reader.IsUTF8()) == kSuccess;
+    });
+    return changed;
 }
 
 void WarningDialog(const std::string& vstrText) {

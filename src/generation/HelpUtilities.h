@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Error.h"
+#include "generation/FolderOperations.h"
 
 #include <cstdint>
 #include <string>
@@ -8,6 +8,8 @@
 
 /// Small operations that the steps of a generation share.
 namespace tovimar {
+
+class CHelpPrjTreeNode;
 
 /// The `link` element of a page's style sheet: its file name without the folder. Empty for an empty path.
 std::string GetStyleSheetLinkHtml(const std::string& vstrCSSFullPath);
@@ -19,21 +21,25 @@ std::string GetStyleSheetLinkHtml(const std::string& vstrCSSFullPath);
 std::string ReplaceTagsAndCopy(const std::string& vstrTemplateFullPath, const std::string& vstrTargetFullPath,
                                const std::vector<std::string>& rcolTags);
 
-/// Makes the folder with all missing parents; true when it stands afterwards.
-bool CreateFolderPath(const std::string& vstrPath);
-/// True when a file "test.txt" could be made in the folder; it is deleted again.
-bool TestFolderWritable(const std::string& vstrFolder);
-
 /// Folder of the help compiler hhc.exe with a trailing backslash; empty when it isn't installed.
 std::string GetHtmlHelpWorkshopExePath();
 
-/// Opens a file or folder with its program for "open", or runs a program when parameters or waiting are asked
-/// for. Above 32 for success, as the platform has it; else 31, or the failure of the start.
-std::int32_t ShellExecute(const std::string& file, const std::string& verb, const std::string& parameters,
-                          bool vfWait);
-/// Runs a command line and waits for its end without limit. 0, or the failure of the start; the window style
-/// is the platform's to heed.
-ResultCode ShellAndWait(const std::string& command, std::int32_t windowStyle);
+/// Index of a tree view's image by its key, without regard to case; 0 for an unknown one.
+std::int32_t GetTreeIconIndex(const std::string& vstrKey);
+/// Gives the node's entry in the view the image of its state; nothing without an entry.
+void SetTreeNodeIcon(CHelpPrjTreeNode& node);
+/// The name begins with "Form_", "Report_", either.
+bool IsFormModuleName(const std::string& vstrName);
+bool IsReportModuleName(const std::string& vstrName);
+bool IsFormOrReportModuleName(const std::string& vstrName);
+/// The `style` element that zooms a page by a text such as "120%"; empty for an empty text.
+std::string GetZoomStyleHtml(const std::string& vstrPercent);
+/// The first 32 characters of a longer text, with "..." behind.
+std::string ShortenCaption(const std::string& vstrText);
+/// Split at "|"; an empty text has no parts.
+std::vector<std::string> SplitToList(const std::string& vstrText);
+/// Takes the file's own folder out of its links. True when there was one.
+bool SetRelativePath(const std::string& vstrPath);
 
 /// A warning with the exclamation icon, title "Tovimar Add-In".
 void WarningDialog(const std::string& vstrText);

@@ -47,20 +47,24 @@ void SavePage(clsHTMLFile& page, const CHelpPrjTreeNode& node, const std::string
     page.Save();
 }
 
-void ObjectTopic::Make() {
+bool ObjectTopic::Find() {
     auto& host = HostAgent();
     type_ = node_.ObjectType();
-    if (const std::string source = node_.SourceProjectName(); !source.empty())
+    if (const std::string source = node_.SourceProjectName(); !source.empty()) {
         host.SetCurrentSourceProject(source);
+        TraceText([&] { return "ProcessHelpTreeAndGenerateHelp1.SetCurrentSourceProject " + source; });
+    }
     const bool exists = host.ComponentExistsTest(type_, node_.Name());
     TraceText([&] {
         return LongDateAndTime() + ": ComponentName = " + node_.Name() +
                ", ObjectType = " + std::to_string(type_) + ", Exists = " + (exists ? "True" : "False");
     });
-    if (!exists) {
+    if (!exists)
         node_.SetSkipped(true);
-        return;
-    }
+    return exists;
+}
+
+void ObjectTopic::Make() {
     CountObject();
     DeleteOldTopic();
     FixPaths();
@@ -69,7 +73,7 @@ void ObjectTopic::Make() {
                                               /*vfPreviewAreaOnly=*/false, {}, /*vfKeepOpened=*/true);
     if (!form_->Name.empty())
         TakeOver();
-    host.CloseComponent(type_, node_.Name(), /*saveComponentFlag=*/false);
+    HostAgent().CloseComponent(type_, node_.Name(), /*saveComponentFlag=*/false);
     form_->hWnd = 0;
     Render();
     SaveDefinition();
@@ -150,6 +154,7 @@ void ObjectTopic::Render() {
         form_->SaveHTML4Table(topic_, "macro.htm", /*HtmlOfReport=*/true);
         break;
     case ObjectType::kWorksheet:
+        TraceText([] { return std::string("1. CTovimar.GetWksHtml"); });
         RenderWorksheet("worksheet.htm");
         break;
     case ObjectType::kChart:
@@ -162,8 +167,10 @@ void ObjectTopic::Render() {
 }
 
 void ObjectTopic::RenderWorksheet(const char* templateFile) {
-    form_->SaveHTML4Worksheet(topic_, templateFile, /*HtmlOfReport=*/true, false, true, {}, {},
-                              HostAgent().GetWksHtml(node_.Name()));
+    const std::string cells = HostAgent().GetWksHtml(node_.Name());
+    if (type_ == ObjectType::kWorksheet)
+        TraceText([] { return std::string("2. CTovimar.GetWksHtml"); });
+    form_->SaveHTML4Worksheet(topic_, templateFile, /*HtmlOfReport=*/true, false, true, {}, {}, cells);
 }
 
 void ObjectTopic::SaveDefinition() {

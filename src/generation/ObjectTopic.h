@@ -19,8 +19,9 @@ class ObjectTopic {
 public:
     ObjectTopic(CTovimar& generator, CHelpPrjTreeNode& node) : generator_(generator), node_(node) {}
 
-    /// Raises what fails; `SavingDetail` then says what was being saved, if anything. An object that is gone
-    /// is marked as skipped and keeps its files.
+    /// False for an object that is gone: it is marked as skipped and keeps its files.
+    bool Find();
+    /// Raises what fails; `SavingDetail` then says what was being saved, if anything.
     void Make();
     const std::string& SavingDetail() const { return savingDetail_; }
 

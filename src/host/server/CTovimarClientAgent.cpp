@@ -29,8 +29,9 @@ ResultCode CTovimarClientAgent::Connect(HostObject robjApp) {
 void CTovimarClientAgent::Disconnect() {
     if (!context_)
         return;
-    context_->Disconnect();
     CTovimarServer& server = TheServer();
+    server.CloseFormsOnDisconnection();
+    context_->Disconnect();
     server.Disconnect();
     server.TovimarClientCallBack = nullptr;
     context_.reset();

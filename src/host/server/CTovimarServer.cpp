@@ -6,10 +6,13 @@
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimar.h"
+#include "generation/CTovimarActions.h"
 #include "generation/HelpUtilities.h"
+#include "host/server/CRequestQueue.h"
 #include "host/server/CTovimarServerAgent.h"
 #include "host/server/CTovimarServerData.h"
 #include "host/server/CXmlCommand.h"
+#include "host/server/IHelpEditorForm.h"
 #include "platform/Environment.h"
 #include "project/ComponentFileName.h"
 
@@ -51,6 +54,10 @@ void CTovimarServer::Connect() {
         agent_ = std::make_unique<CTovimarServerAgent>(*this);
     Session::SetServerAgent(agent_.get());
     data_->Generator();
+    if (!actions_) {
+        actions_ = std::make_unique<CTovimarActions>();
+        actions_->Init();
+    }
 }
 
 void CTovimarServer::Disconnect() {
@@ -65,9 +72,21 @@ void CTovimarServer::Disconnect() {
     if (Session::Server() == this)
         Session::SetServer(nullptr);
     data_.reset();
+    queue_.reset();
+    if (actions_)
+        actions_->Terminate();
+    actions_.reset();
+    helpEditor_.reset();
     agent_.reset();
     compilerTestDone_ = false;
     htmlWorkshopInstalled_ = false;
+}
+
+CTovimarActions& CTovimarServer::Actions() {
+    constexpr ResultCode kNoObject = 91;
+    if (actions_)
+        return *actions_;
+    throw RaisedError(kNoObject, "No server is connected", "CTovimarServer.Actions");
 }
 
 std::string CTovimarServer::SendCommand(const std::string& vstrCommand) {

@@ -11,6 +11,7 @@
 #include "foundation/Product.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimar.h"
+#include "generation/CTovimarActions.h"
 #include "generation/CTovimarParameters.h"
 #include "generation/CTovimarStats.h"
 #include "generation/RunProgress.h"
@@ -18,12 +19,10 @@
 #include "host/server/CTovimarServerAgent.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
-#include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
 
 #include <functional>
-#include <vector>
 
 namespace tovimar {
 namespace {
@@ -76,7 +75,7 @@ void CTovimarServerData::Release() {
     });
     Session::SetMessages(nullptr);
     messages_.reset();
-    IDEAppInstance.reset();
+    ReleaseStep("mobjIDEAppInstance", [this] { IDEAppInstance.reset(); });
     Session::SetTraceLog(nullptr);
     traceLog_.reset();
 }
@@ -243,19 +242,16 @@ std::string CTovimarServerData::CurrentSourceProjectFullPath() {
 }
 
 std::string CTovimarServerData::SourceProjectsList() {
-    std::vector<std::string> names;
-    for (const std::string& name : HostAgent().GetSourceProjectsList())
-        names.push_back(name);
-    return text::Join(names, "|");
+    return CTovimarActions::concatProjectsListFromCollection(HostAgent().GetSourceProjectsList());
 }
 
-void CTovimarServerData::SaveTree(const std::string& path, const std::string& extraAttributes,
-                                  const std::string& picsSubfolderName) {
+ResultCode CTovimarServerData::SaveTree(const std::string& path, const std::string& extraAttributes,
+                                        const std::string& picsSubfolderName) {
     CHelpPrjTree* tree = Session::HelpProjectTree();
     if (tree == nullptr || tree->Root() == nullptr)
-        return;
+        return kSuccess;
     tree->Root()->SetPicsSubfolderName(picsSubfolderName);
-    tree->SaveXml(path, /*vfSkipSerializers=*/true, extraAttributes);
+    return tree->SaveXml(path, /*vfSkipSerializers=*/true, extraAttributes);
 }
 
 } // namespace tovimar
