@@ -1,6 +1,7 @@
 /// `hhc.exe PROJECT.hhp`: the help compiler's command line in front of `chmcmd`. It hands over a copy of the
 /// project that `chmcmd` can read, runs it in the project's folder and leaves the compiled file there.
 /// Exit code 0: compiled; 1: compiled with complaints, or not at all; 2: no project or no compiler.
+#include "Container.h"
 #include "ProjectFile.h"
 
 #include <cerrno>
@@ -79,11 +80,31 @@ int RunCompiler(const fs::path& project) {
     return WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
 }
 
-int Compile(const fs::path& path) {
+bool Read(const fs::path& path, std::string& bytes) {
     std::ifstream file(path, std::ios::binary);
     if (!file)
+        return false;
+    bytes.assign(std::istreambuf_iterator<char>(file), {});
+    return true;
+}
+
+/// False when the finished file can't be written; it is replaced by a finished one or not at all.
+bool Finish(const fs::path& compiled) {
+    std::string bytes;
+    if (!Read(compiled, bytes) || !hhc::SetRight(bytes))
+        return false;
+    const TemporaryFile copy{fs::path(compiled) += ".tmp"};
+    if (!(std::ofstream(copy.path, std::ios::binary) << bytes << std::flush))
+        return false;
+    std::error_code error;
+    fs::rename(copy.path, compiled, error);
+    return !error;
+}
+
+int Compile(const fs::path& path) {
+    std::string bytes;
+    if (!Read(path, bytes))
         return Fail(2, "can't read the project '" + path.string() + "': " + std::strerror(errno));
-    const std::string bytes{std::istreambuf_iterator<char>(file), {}};
     const hhc::TranslatedProject project = hhc::Translate(path, bytes);
     for (const std::string& name : project.missing)
         std::fprintf(stderr, "hhc: warning: '%s' is in the project but not on the disk\n", name.c_str());
@@ -106,6 +127,8 @@ int Compile(const fs::path& path) {
         return Fail(1, "'" + path.string() + "' was not compiled, chmcmd ended with " +
                            std::to_string(exitCode));
     }
+    if (!Finish(project.compiledFile))
+        return Fail(1, "can't finish '" + project.compiledFile.string() + "': " + std::strerror(errno));
     return project.missing.empty() ? 0 : 1;
 }
 
