@@ -5,6 +5,7 @@
 #include "platform/KeyedList.h"
 
 #include <memory>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -27,8 +28,10 @@ public:
     CAddInProject* ProjectExists(const std::string& vstrProjectName);
     bool IsSavedProject(const std::string& vstrProjectName);
     CAddInProject* Project(const std::string& vstrProjectName);
-    /// Writes the catalogue, and the tree first when a path for it is given.
-    void Save(const std::string& vstrProjectTreeFullPathToSave = {});
+    /// Writes the catalogue, and the tree first when a path for it is given. What other processes listed or
+    /// forgot since it was read is taken over. 0, or the failure, which is reported; the old files stand
+    /// then.
+    ResultCode Save(const std::string& vstrProjectTreeFullPathToSave = {});
     /// A listed project or null; not owned.
     void SetCurrentProject(CAddInProject* robjProject);
     /// Makes a project current that isn't listed yet; the catalogue owns it. `ListCurrentProject` adds it.
@@ -42,8 +45,8 @@ public:
     /// Raises 0x80040001 when none is free.
     std::string GetUniqueProjectName(const std::string& vstrSourceProjectName);
     bool ChangeCurrentProjectName(const std::string& vstrNewName);
-    /// Takes a project out of the list, by the path of its project file; its files stay, and `Save` writes the
-    /// list. False when it isn't listed.
+    /// Takes a project out of the list, by the path of its project file; its files stay, and `Save` writes
+    /// the list. False when it isn't listed.
     bool Forget(const std::string& vstrTVPFullPath);
     /// Drops every project that was never saved.
     void RemoveTempProjects();
@@ -58,8 +61,10 @@ private:
     List& Projects();
     void ReadCatalogue();
     void ReadProject(const XmlNode& element);
-    void SaveTree(const std::string& path);
+    ResultCode SaveTree(const std::string& path);
     void SaveCatalogue();
+    void TakeOverChanges();
+    void NoteListed(const XmlNode& projects);
     void WriteCatalogue(const std::string& text);
     void Remove(std::size_t position);
 
@@ -67,6 +72,8 @@ private:
     CAddInProject* current_ = nullptr;
     std::unique_ptr<CAddInProject> unlistedCurrent_;
     std::string path_;
+    /// Folded paths of the project files in the catalogue's file, as this process last read or wrote it.
+    std::set<std::string> listed_;
     bool loaded_ = false;
     bool loading_ = false;
 };

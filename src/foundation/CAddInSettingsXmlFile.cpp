@@ -129,7 +129,7 @@ void CAddInSettingsXmlFile::WriteChecked(const std::string& path) {
     if (const ResultCode written = CXMLFile().SaveXml(temporary, XMLSTr({}, &defaults)); written != 0)
         throw RaisedError(written, "Error saving file " + temporary, "CAddInSettingsXmlFile.Save");
     RaiseIfIllFormed(temporary);
-    files.CopyFile(temporary, path);
+    files.WriteFileToDisk(path, files.ReadFile(temporary));
     files.DeleteFile(temporary);
 }
 

@@ -44,7 +44,8 @@ std::string EncodePlainText(const std::string& text) {
 }
 
 ResultCode CUTF8FileWriter::SaveFile(const std::string& vstrFileFullPath, const std::string& vstrText,
-                                     bool vfAddUTF8FileHeader, bool vfSaveAsUsualTextFileIfNotUTF8) {
+                                     bool vfAddUTF8FileHeader, bool vfSaveAsUsualTextFileIfNotUTF8,
+                                     Durability durability) {
     if (vstrFileFullPath.empty())
         return kGeneralFailure;
     const std::string& text = vstrText.empty() ? text_ : vstrText;
@@ -52,8 +53,11 @@ ResultCode CUTF8FileWriter::SaveFile(const std::string& vstrFileFullPath, const 
     return Trapped(
         "CUTF8FileWriter", "SaveFile",
         [&] {
-            files.WriteFile(vstrFileFullPath,
-                            BytesOf(text, vfAddUTF8FileHeader, vfSaveAsUsualTextFileIfNotUTF8));
+            const std::string bytes = BytesOf(text, vfAddUTF8FileHeader, vfSaveAsUsualTextFileIfNotUTF8);
+            if (durability == Durability::OnDisk)
+                files.WriteFileToDisk(vstrFileFullPath, bytes);
+            else
+                files.WriteFile(vstrFileFullPath, bytes);
         },
         [&] {
             return "File = " + vstrFileFullPath +

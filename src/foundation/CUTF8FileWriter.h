@@ -6,6 +6,9 @@
 
 namespace tovimar {
 
+/// OnDisk: the file survives a power cut once it is saved. For the few files that nobody can make again.
+enum class Durability { Ordinary, OnDisk };
+
 /// Writes text files. A file is replaced by a finished one; an existing read-only file is a failure.
 class CUTF8FileWriter {
 public:
@@ -18,7 +21,8 @@ public:
     /// code page; what the page can't hold becomes a numeric reference in HTML and "?" elsewhere.
     /// 0; kGeneralFailure for an empty path; other failures are reported and their number returned.
     ResultCode SaveFile(const std::string& vstrFileFullPath, const std::string& vstrText = {},
-                        bool vfAddUTF8FileHeader = false, bool vfSaveAsUsualTextFileIfNotUTF8 = false);
+                        bool vfAddUTF8FileHeader = false, bool vfSaveAsUsualTextFileIfNotUTF8 = false,
+                        Durability durability = Durability::Ordinary);
 
 private:
     std::string text_;

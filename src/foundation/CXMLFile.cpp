@@ -1,6 +1,5 @@
 #include "foundation/CXMLFile.h"
 
-#include "foundation/CUTF8FileWriter.h"
 #include "platform/text/Text.h"
 #include "platform/xml/XmlDocument.h"
 
@@ -37,10 +36,13 @@ ResultCode CXMLFile::LoadXml(const std::string& vstrXmlStr, XmlDocument& robjXml
     return XmlParseError.errorCode;
 }
 
-ResultCode CXMLFile::SaveXml(const std::string& vstrXmlFileFullPath, const std::string& vstrXmlStr) {
+ResultCode CXMLFile::SaveXml(const std::string& vstrXmlFileFullPath, const std::string& vstrXmlStr,
+                             Durability durability) {
     const bool hasHeader = vstrXmlStr.find(kXmlHeader) != std::string::npos;
     return CUTF8FileWriter().SaveFile(vstrXmlFileFullPath,
-                                      hasHeader ? vstrXmlStr : std::string(kXmlHeader) + "\r\n" + vstrXmlStr);
+                                      hasHeader ? vstrXmlStr : std::string(kXmlHeader) + "\r\n" + vstrXmlStr,
+                                      /*vfAddUTF8FileHeader=*/false,
+                                      /*vfSaveAsUsualTextFileIfNotUTF8=*/false, durability);
 }
 
 } // namespace tovimar

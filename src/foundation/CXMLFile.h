@@ -1,5 +1,6 @@
 #pragma once
 
+#include "foundation/CUTF8FileWriter.h"
 #include "foundation/CXmlParseError.h"
 
 #include <string>
@@ -21,7 +22,8 @@ public:
     /// "Invalid xml file header" for a header without its end.
     ResultCode LoadXml(const std::string& vstrXmlStr, XmlDocument& robjXmlDoc, bool vfUseUnicode = false);
     /// Writes a text as UTF-8, with the header in front when the text has none. 0, or the failure's number.
-    ResultCode SaveXml(const std::string& vstrXmlFileFullPath, const std::string& vstrXmlStr);
+    ResultCode SaveXml(const std::string& vstrXmlFileFullPath, const std::string& vstrXmlStr,
+                       Durability durability = Durability::Ordinary);
 
     /// Report of the last load; its code is 0 when that succeeded.
     CXmlParseError XmlParseError;

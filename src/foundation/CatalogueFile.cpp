@@ -8,6 +8,7 @@
 #include "foundation/TextEncodings.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
+#include "platform/text/Text.h"
 #include "platform/xml/XmlDocument.h"
 
 /// Reading and writing the catalogue's file.
@@ -41,6 +42,30 @@ void LoadOrRepair(const std::string& path, XmlDocument& document) {
 std::string EitherAttribute(const XmlNode& element, const char* lower, const char* upper) {
     const std::string value = element.attribute(lower);
     return value.empty() ? element.attribute(upper) : value;
+}
+
+/// An identifier is written as it is, so one that holds a mark of the file's form would break the file.
+std::string IdentifierOf(const XmlNode& element, const char* name) {
+    std::string identifier = element.attribute(name);
+    if (identifier.find_first_of("\"<&\r\n\t") != std::string::npos)
+        identifier.clear();
+    return identifier;
+}
+
+std::unique_ptr<CAddInProject> ProjectOf(const XmlNode& element) {
+    auto project = std::make_unique<CAddInProject>();
+    project->Name = EitherAttribute(element, "name", "Name");
+    project->FileName = element.attribute("FileName");
+    project->Folder = element.attribute("Folder");
+    project->SourceProjectFullPath = element.attribute("SourceProjectFullPath");
+    project->SUID = IdentifierOf(element, "SUID");
+    project->HUID = IdentifierOf(element, "HUID");
+    project->IsNew = false;
+    return project;
+}
+
+std::string KeyOf(const CAddInProject& project) {
+    return text::FoldCase(project.TvpFullPath());
 }
 
 /// Title and pictures folder stand in the project's own file.
@@ -89,18 +114,12 @@ void CAddInProjects::ReadCatalogue() {
         throw RaisedError(kFailure1, "XML Projects file parse error [" + path_ + "]", "CAddInProjects.Init");
     for (const XmlNode& element : projects.childElements())
         ReadProject(element);
+    NoteListed(projects);
     loaded_ = true;
 }
 
 void CAddInProjects::ReadProject(const XmlNode& element) {
-    auto project = std::make_unique<CAddInProject>();
-    project->Name = EitherAttribute(element, "name", "Name");
-    project->FileName = element.attribute("FileName");
-    project->Folder = element.attribute("Folder");
-    project->SourceProjectFullPath = element.attribute("SourceProjectFullPath");
-    project->SUID = element.attribute("SUID");
-    project->HUID = element.attribute("HUID");
-    project->IsNew = false;
+    auto project = ProjectOf(element);
     try {
         const std::string path = project->TvpFullPath();
         if (!path.empty() && !platform::Env().files->FileExists(path))
@@ -114,31 +133,45 @@ void CAddInProjects::ReadProject(const XmlNode& element) {
     }
 }
 
+void CAddInProjects::NoteListed(const XmlNode& projects) {
+    listed_.clear();
+    for (const XmlNode& element : projects.childElements())
+        listed_.insert(KeyOf(*ProjectOf(element)));
+}
+
 ResultCode CAddInProjects::SaveCurrentProject(const std::string& vstrFullPath2Save) {
-    return Trapped(kClass, "SaveCurrentProject", [&] {
-        const bool ownFile = vstrFullPath2Save.empty() && current_ != nullptr;
-        Save(ownFile ? current_->TvpFullPath() : vstrFullPath2Save);
-    });
+    const bool ownFile = vstrFullPath2Save.empty() && current_ != nullptr;
+    return Save(ownFile ? current_->TvpFullPath() : vstrFullPath2Save);
 }
 
-void CAddInProjects::Save(const std::string& vstrProjectTreeFullPathToSave) {
-    Projects();
-    if (!vstrProjectTreeFullPathToSave.empty())
-        SaveTree(vstrProjectTreeFullPathToSave);
-    SaveCatalogue();
+ResultCode CAddInProjects::Save(const std::string& vstrProjectTreeFullPathToSave) {
+    ResultCode tree = kSuccess;
+    const ResultCode catalogue = Trapped(
+        kClass, "Save",
+        [&] {
+            Projects();
+            if (!vstrProjectTreeFullPathToSave.empty())
+                tree = SaveTree(vstrProjectTreeFullPathToSave);
+            SaveCatalogue();
+        },
+        [&] { return "File = " + path_; });
+    return tree != kSuccess ? tree : catalogue;
 }
 
-void CAddInProjects::SaveTree(const std::string& path) {
+ResultCode CAddInProjects::SaveTree(const std::string& path) {
     std::string attributes;
     if (current_ != nullptr)
         attributes = "Name = \"" + EncodeSpecialChars(current_->Name) + "\" SUID = \"" + current_->SUID +
                      "\" HUID = \"" + current_->HUID + "\" ";
-    Session::Context().SaveTree(path, attributes,
-                                current_ != nullptr ? current_->PicsSubfolderName : std::string());
+    return Session::Context().SaveTree(path, attributes,
+                                       current_ != nullptr ? current_->PicsSubfolderName : std::string());
 }
 
 void CAddInProjects::SaveCatalogue() {
+    const auto lock = platform::Env().files->LockFolder(platform::FolderOf(path_));
+    TakeOverChanges();
     std::string text = "<Projects>\r\n";
+    listed_.clear();
     for (const auto& project : list_) {
         if (project->TvpFullPath().empty())
             continue;
@@ -146,8 +179,28 @@ void CAddInProjects::SaveCatalogue() {
             project->SetTitle(Session::Context().HelpProjectTitle());
         text += ProjectLine(*project);
         project->IsNew = false;
+        listed_.insert(KeyOf(*project));
     }
     WriteCatalogue(text + "</Projects>");
+}
+
+/// The file may have been written by another process since: what it listed comes in, what it forgot goes.
+void CAddInProjects::TakeOverChanges() {
+    XmlDocument document;
+    if (!platform::Env().files->FileExists(path_) || CXMLFile().Load(path_, document) != 0)
+        return;
+    std::set<std::string> inFile;
+    for (const XmlNode& element : document.selectSingleNode("//Projects").childElements()) {
+        const std::string key = KeyOf(*ProjectOf(element));
+        inFile.insert(key);
+        if (!listed_.contains(key))
+            ReadProject(element);
+    }
+    for (std::size_t i = list_.Count(); i > 0; --i) {
+        const std::string key = KeyOf(*list_.At(i));
+        if (list_.At(i).get() != current_ && listed_.contains(key) && !inFile.contains(key))
+            Remove(i);
+    }
 }
 
 void CAddInProjects::WriteCatalogue(const std::string& text) {
@@ -157,7 +210,7 @@ void CAddInProjects::WriteCatalogue(const std::string& text) {
     if (hadFile)
         files.CopyFile(path_, path_ + ".bak");
     CXMLFile file;
-    file.SaveXml(path_, text);
+    file.SaveXml(path_, text, Durability::OnDisk);
     environment.doEvents();
     XmlDocument document;
     if (file.Load(path_, document) != 0 && hadFile)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "foundation/RunState.h"
+#include "platform/Error.h"
 
 #include <memory>
 #include <string>
@@ -38,9 +39,12 @@ public:
     /// Of the source project at hand, by the host; empty without one.
     virtual std::string CurrentSourceProjectFullPath() { return {}; }
     virtual std::string SourceProjectsList() { return {}; }
-    /// Writes the tree into a project file, placeholders left out; nothing without a tree.
-    virtual void SaveTree(const std::string& /*path*/, const std::string& /*extraAttributes*/,
-                          const std::string& /*picsSubfolderName*/) {}
+    /// Writes the tree into a project file, placeholders left out; nothing without a tree. 0, or the failure,
+    /// which is reported.
+    virtual ResultCode SaveTree(const std::string& /*path*/, const std::string& /*extraAttributes*/,
+                                const std::string& /*picsSubfolderName*/) {
+        return kSuccess;
+    }
 };
 
 /// The process-wide accessors. Nothing passes these objects down; code asks here. All pointers are not

@@ -47,7 +47,7 @@ void LoadFolder(Parameters& parameters, const Value& value) {
 }
 
 void LoadHeadingLevel(Parameters& parameters, const Value& value) {
-    int level = 0;
+    int level = parameters.MSWordTOCLowerHeadingLevel;
     PassOver([&] { level = value.AsInteger(); });
     parameters.MSWordTOCLowerHeadingLevel = level < 1 || level > 9 ? 2 : level;
 }

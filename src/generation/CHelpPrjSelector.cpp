@@ -53,22 +53,25 @@ CAddInProject* ListProject(const std::string& path, bool external, ResultCode& r
     return &catalogue.Add(std::move(project));
 }
 
-/// The open project must not be lost when another takes its place.
-void SaveAndCloseOpenTree() {
+/// The open project must not be lost when another takes its place: it stays open when it can't be saved.
+ResultCode SaveAndCloseOpenTree() {
     auto* tree = Session::HelpProjectTree();
     if (tree == nullptr || tree->Root() == nullptr)
-        return;
-    Catalogue().SaveCurrentProject();
+        return kSuccess;
+    if (const ResultCode saved = Catalogue().SaveCurrentProject(); saved != kSuccess)
+        return saved;
     if (auto* generator = Session::Generator())
         generator->UnLoadTreviewForActiveProject();
     else
         tree->Terminate();
+    return kSuccess;
 }
 
 ResultCode MakeCurrent(const std::string& path, bool external, bool setTree) {
     // Before the catalogue forgets which project the tree belongs to.
-    SaveAndCloseOpenTree();
-    ResultCode result = kSuccess;
+    ResultCode result = SaveAndCloseOpenTree();
+    if (result != kSuccess)
+        return result;
     auto* project = Catalogue().GetProjectDefinitionByTvpFullPath(path);
     if (project == nullptr)
         project = ListProject(path, external, result);

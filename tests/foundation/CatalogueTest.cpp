@@ -7,12 +7,14 @@ namespace {
 
 struct Source : IRunContext {
     std::string CurrentSourceProjectFullPath() override { return path; }
-    void SaveTree(const std::string& file, const std::string& attributes,
-                  const std::string& pictures) override {
+    ResultCode SaveTree(const std::string& file, const std::string& attributes,
+                        const std::string& pictures) override {
         saved.push_back(file + "|" + attributes + "|" + pictures);
+        return treeResult;
     }
     std::string path = "C:\\Shop.mdb";
     std::vector<std::string> saved;
+    ResultCode treeResult = kSuccess;
 };
 
 class CatalogueTest : public test::EnvironmentTest {

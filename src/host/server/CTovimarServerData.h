@@ -73,8 +73,8 @@ public:
     std::string HelpProjectTitle() override;
     std::string CurrentSourceProjectFullPath() override;
     std::string SourceProjectsList() override;
-    void SaveTree(const std::string& path, const std::string& extraAttributes,
-                  const std::string& picsSubfolderName) override;
+    ResultCode SaveTree(const std::string& path, const std::string& extraAttributes,
+                        const std::string& picsSubfolderName) override;
 
 private:
     void TraceProgress(const char* operation, std::int32_t value);

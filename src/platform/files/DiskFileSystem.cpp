@@ -11,6 +11,7 @@
 #include <cstdio>
 #include <fcntl.h>
 #include <unistd.h>
+#include <utility>
 
 namespace tovimar::platform {
 namespace fs = std::filesystem;
@@ -44,18 +45,34 @@ std::string BehindLinks(const std::string& nativePath) {
     return failure ? nativePath : target.string();
 }
 
+enum class Durability { Ordinary, OnDisk };
+
 /// Writes beside the target and moves the finished file over it.
-void ReplaceFile(const std::string& nativePath, std::string_view bytes) {
+void ReplaceFile(const std::string& nativePath, std::string_view bytes,
+                 Durability durability = Durability::Ordinary) {
     const std::string target = BehindLinks(nativePath);
     NativeFile file = NativeFile::TemporaryBeside(target);
     try {
         file.WriteAll(bytes);
+        if (durability == Durability::OnDisk)
+            file.Sync();
         file.Close();
         if (rename(file.Path().c_str(), target.c_str()) != 0)
             RaiseFileFailure(errno, target);
     } catch (...) {
         unlink(file.Path().c_str());
         throw;
+    }
+}
+
+/// A file's new name is on the disk when its folder is. The file itself is safe by now, so a folder that
+/// can't be opened is no failure.
+void SyncFolderOf(const std::string& nativePath) {
+    const std::string target = BehindLinks(nativePath);
+    try {
+        NativeFile(target.substr(0, target.rfind('/') + 1), O_RDONLY | O_DIRECTORY).Sync();
+    } catch (const RaisedError&) {
+        return;
     }
 }
 
@@ -70,6 +87,31 @@ void WriteNewFile(const std::string& nativePath, std::string_view bytes) {
         throw;
     }
 }
+
+/// What stands behind `offset`; empty when that is more than an end.
+std::string ShortTail(const NativeFile& file, std::uint64_t offset) {
+    constexpr std::uint64_t kMost = 4096;
+    const auto size = static_cast<std::uint64_t>(file.Info().st_size);
+    if (size <= offset || size - offset > kMost)
+        return {};
+    file.SeekTo(static_cast<off_t>(offset));
+    return file.ReadHere(size - offset);
+}
+
+void PutTail(const NativeFile& file, std::uint64_t offset, std::string_view bytes) {
+    file.SeekTo(static_cast<off_t>(offset));
+    file.WriteAll(bytes);
+    file.CutHere();
+}
+
+/// The lock of a folder's descriptor, which goes when the process does, however it ends.
+class HeldFolder : public FolderLock {
+public:
+    explicit HeldFolder(NativeFile folder) : folder_(std::move(folder)) {}
+
+private:
+    NativeFile folder_;
+};
 
 void SortIgnoringCase(std::vector<std::string>& names) {
     std::sort(names.begin(), names.end(), [](const std::string& left, const std::string& right) {
@@ -124,6 +166,16 @@ void DiskFileSystem::WriteFile(const std::string& path, std::string_view bytes) 
     NoteEntry(native, true);
 }
 
+void DiskFileSystem::WriteFileToDisk(const std::string& path, std::string_view bytes) {
+    const std::string native = Resolve(path);
+    if (KindOf(native) == Kind::Folder)
+        RaiseFileNumber(kPathAccessError, native);
+    RaiseIfReadOnly(native);
+    ReplaceFile(native, bytes, Durability::OnDisk);
+    NoteEntry(native, true);
+    SyncFolderOf(native);
+}
+
 void DiskFileSystem::AppendFile(const std::string& path, std::string_view bytes) {
     const std::string native = Resolve(path);
     RaiseIfReadOnly(native);
@@ -136,10 +188,16 @@ void DiskFileSystem::AppendFile(const std::string& path, std::string_view bytes)
 void DiskFileSystem::OverwriteTail(const std::string& path, std::uint64_t offset, std::string_view bytes) {
     const std::string native = Resolve(path);
     RaiseIfReadOnly(native);
-    NativeFile file(native, O_WRONLY);
-    file.SeekTo(static_cast<off_t>(offset));
-    file.WriteAll(bytes);
-    file.CutHere();
+    NativeFile file(native, O_RDWR);
+    const std::string before = ShortTail(file, offset);
+    try {
+        PutTail(file, offset, bytes);
+    } catch (const RaisedError&) {
+        // Its place on the disk was taken already, so what stood there fits again.
+        if (!before.empty())
+            PutTail(file, offset, before);
+        throw;
+    }
     file.Close();
 }
 
@@ -221,6 +279,22 @@ std::int64_t DiskFileSystem::FileTime(const std::string& path) {
 
 std::vector<std::string> DiskFileSystem::ListFiles(const std::string& folder, const std::string& pattern) {
     return NamesIn(Resolve(folder), false, pattern);
+}
+
+std::unique_ptr<FolderLock> DiskFileSystem::LockFolder(const std::string& folder) {
+    constexpr int kTries = 500;
+    constexpr useconds_t kPause = 10'000;
+    try {
+        NativeFile place(Resolve(folder), O_RDONLY | O_DIRECTORY);
+        for (int i = 0; i < kTries; ++i) {
+            if (place.TryLock())
+                return std::make_unique<HeldFolder>(std::move(place));
+            usleep(kPause);
+        }
+    } catch (const RaisedError&) {
+        return nullptr;
+    }
+    return nullptr;
 }
 
 std::vector<std::string> DiskFileSystem::ListFolders(const std::string& folder) {

@@ -19,6 +19,7 @@ public:
     bool FolderExists(const std::string& path) override;
     std::string ReadFile(const std::string& path) override;
     void WriteFile(const std::string& path, std::string_view bytes) override;
+    void WriteFileToDisk(const std::string& path, std::string_view bytes) override;
     void AppendFile(const std::string& path, std::string_view bytes) override;
     void OverwriteTail(const std::string& path, std::uint64_t offset, std::string_view bytes) override;
     void DeleteFile(const std::string& path) override;
@@ -30,6 +31,7 @@ public:
     std::int64_t FileTime(const std::string& path) override;
     std::vector<std::string> ListFiles(const std::string& folder, const std::string& pattern) override;
     std::vector<std::string> ListFolders(const std::string& folder) override;
+    std::unique_ptr<FolderLock> LockFolder(const std::string& folder) override;
     std::string ToNative(const std::string& path) override;
     std::string FromNative(const std::string& nativePath) override;
 

@@ -5,6 +5,7 @@
 #include <cerrno>
 #include <cstdlib>
 #include <fcntl.h>
+#include <sys/file.h>
 #include <unistd.h>
 #include <utility>
 
@@ -36,7 +37,11 @@ NativeFile NativeFile::TemporaryBeside(const std::string& target) {
         RaiseFileFailure(errno, target);
     NativeFile file(descriptor, pattern);
     struct stat info {};
-    fchmod(descriptor, stat(target.c_str(), &info) == 0 ? info.st_mode & 07777 : ModeForNewFiles());
+    const bool stands = stat(target.c_str(), &info) == 0;
+    // Before the mode: a change of the owner takes bits of it away.
+    if (stands && fchown(descriptor, info.st_uid, info.st_gid) != 0)
+        errno = 0;
+    fchmod(descriptor, stands ? info.st_mode & 07777 : ModeForNewFiles());
     return file;
 }
 
@@ -59,7 +64,11 @@ std::string NativeFile::ReadAll() const {
     const auto info = Info();
     if (!S_ISREG(info.st_mode))
         RaiseFileNumber(kPathAccessError, path_);
-    std::string bytes(static_cast<std::size_t>(info.st_size), '\0');
+    return ReadHere(static_cast<std::size_t>(info.st_size));
+}
+
+std::string NativeFile::ReadHere(std::size_t most) const {
+    std::string bytes(most, '\0');
     std::size_t done = 0;
     while (done < bytes.size()) {
         const ssize_t got = read(descriptor_, bytes.data() + done, bytes.size() - done);
@@ -95,6 +104,15 @@ void NativeFile::CutHere() const {
     const off_t end = lseek(descriptor_, 0, SEEK_CUR);
     if (end < 0 || ftruncate(descriptor_, end) != 0)
         RaiseFileFailure(errno, path_);
+}
+
+void NativeFile::Sync() const {
+    if (fsync(descriptor_) != 0 && errno != EINVAL && errno != ENOTSUP)
+        RaiseFileFailure(errno, path_);
+}
+
+bool NativeFile::TryLock() const {
+    return flock(descriptor_, LOCK_EX | LOCK_NB) == 0;
 }
 
 void NativeFile::Close() {

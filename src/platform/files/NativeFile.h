@@ -11,7 +11,8 @@ namespace tovimar::platform {
 class NativeFile {
 public:
     NativeFile(const std::string& path, int flags);
-    /// A fresh file beside `target` with the access rights that `target` has, or a new file gets.
+    /// A fresh file beside `target` with the access rights, and where that is allowed the owner, that
+    /// `target` has, or a new file gets.
     static NativeFile TemporaryBeside(const std::string& target);
     ~NativeFile();
     NativeFile(NativeFile&& other) noexcept;
@@ -20,9 +21,15 @@ public:
     const std::string& Path() const { return path_; }
     struct stat Info() const;
     std::string ReadAll() const;
+    /// From where the file stands, at most so many bytes.
+    std::string ReadHere(std::size_t most) const;
     void WriteAll(std::string_view bytes) const;
     void SeekTo(off_t offset) const;
     void CutHere() const;
+    /// Waits until what was written is on the disk. What can't be waited for, such as a pipe, is no failure.
+    void Sync() const;
+    /// Without waiting; false while another process holds the lock.
+    bool TryLock() const;
     /// Reports what writing left unreported.
     void Close();
 
