@@ -4,6 +4,7 @@
 #include "cli/Surroundings.h"
 #include "foundation/CAddInProject.h"
 #include "foundation/CAddInSettingsXmlFile.h"
+#include "foundation/Product.h"
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CAddInSettings.h"
@@ -251,6 +252,11 @@ void Generation::ShowSourceChanges() const {
             PrintResult("Context ids:   " + objects + " to change, as copies in " +
                         platform::Env().files->ToNative(changes_->CopiesFolder()));
     }
+    if (const auto& failures = changes_->Failures(); !failures.empty())
+        ShowMessage("Context ids could not be written into " + std::to_string(failures.size()) +
+                        (failures.size() == 1 ? " export, " : " exports, the first of them: ") +
+                        failures.front(),
+                    kMsgCritical, kApplicationTitle);
     std::error_code ignored;
     if (!changes_->NotWritten().empty() || !fs::is_directory(arguments_.source, ignored))
         PrintWarning("context ids can't be written into a database file; '" +

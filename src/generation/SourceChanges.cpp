@@ -1,7 +1,9 @@
 #include "generation/SourceChanges.h"
 
 #include "foundation/BackupFileName.h"
+#include "foundation/ErrorTrap.h"
 #include "platform/Environment.h"
+#include "platform/Error.h"
 #include "platform/access/AccessApplication.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
@@ -54,6 +56,14 @@ void SourceChanges::Take(const SavedObject& saved) {
         notWritten_.push_back(saved.name);
         return;
     }
+    try {
+        Write(saved);
+    } catch (const RaisedError& failure) {
+        failures_.emplace_back(failure.what());
+    }
+}
+
+void SourceChanges::Write(const SavedObject& saved) {
     auto& files = *platform::Env().files;
     const std::string bytes = files.ReadFile(saved.exportPath);
     const std::string changed =
@@ -69,8 +79,16 @@ void SourceChanges::Take(const SavedObject& saved) {
 
 void SourceChanges::WriteOriginal(const std::string& path, const std::string& bytes) const {
     auto& files = *platform::Env().files;
-    files.CopyFile(path, BackupPath(path));
-    files.WriteFile(path, bytes);
+    if (files.IsReadOnly(path))
+        throw RaisedError(70, "the file is read-only: '" + files.ToNative(path) + "'", "SourceChanges");
+    const std::string backup = BackupPath(path);
+    files.CopyFile(path, backup);
+    try {
+        files.WriteFile(path, bytes);
+    } catch (const RaisedError&) {
+        PassOver([&] { files.DeleteFile(backup); });
+        throw;
+    }
 }
 
 void SourceChanges::WriteCopy(const std::string& path, const std::string& bytes) const {

@@ -31,10 +31,14 @@ public:
     std::size_t Written() const { return written_; }
     /// Names of saved objects that have no export.
     const std::vector<std::string>& NotWritten() const { return notWritten_; }
+    /// Why an export wasn't written, with its path; it stands as it was. One file that is locked or
+    /// read-only keeps nobody from the others.
+    const std::vector<std::string>& Failures() const { return failures_; }
     const std::string& CopiesFolder() const { return copiesFolder_; }
 
 private:
     void Take(const platform::access::SavedObject& saved);
+    void Write(const platform::access::SavedObject& saved);
     void WriteOriginal(const std::string& path, const std::string& bytes) const;
     void WriteCopy(const std::string& path, const std::string& bytes) const;
     void RemoveCopies() const;
@@ -44,6 +48,7 @@ private:
     std::string copiesFolder_;
     std::size_t written_ = 0;
     std::vector<std::string> notWritten_;
+    std::vector<std::string> failures_;
 };
 
 } // namespace tovimar

@@ -101,6 +101,17 @@ TEST_F(ContextIdsRunTest, OriginalsChangeOnlyWhenAskedAndAreKept) {
     EXPECT_EQ(Header(), header);
 }
 
+TEST_F(ContextIdsRunTest, AnExportThatCantBeWrittenStaysAndIsTold) {
+    const fs::path locked = Folder() / "orchard/forms/Products.form";
+    fs::permissions(locked, fs::perms::owner_read);
+    Run({"generate", "orchard", "--output", "help", "--no-compile", "--write-back"})
+        .ExpectExit(1)
+        .ExpectErrorsHold("Context ids could not be written into 1 export, the file is read-only: "
+                          "'<FOLDER>/orchard/forms/Products.form'");
+    EXPECT_EQ(Source("forms/Products.form"), ReadWhole(kSample + "/forms/Products.form"));
+    EXPECT_THAT(Backups(), ::testing::SizeIs(3)) << "the others are written";
+}
+
 TEST_F(ContextIdsRunTest, IdsOutliveAChangedApplication) {
     Generate();
     const auto before = Header();
