@@ -36,7 +36,7 @@ std::string BytesOf(const std::string& text, bool addHeader, bool plainUnlessMar
 
 } // namespace
 
-std::string EncodePlainText(const std::string& text) {
+std::string EncodePlainText(std::string text) {
     if (text::IsAscii(text))
         return text;
     const text::CodePage& page = text::AnsiCodePage();

@@ -29,6 +29,6 @@ private:
 };
 
 /// Bytes of a plain text file in the ANSI code page, as SaveFile writes them.
-std::string EncodePlainText(const std::string& text);
+std::string EncodePlainText(std::string text);
 
 } // namespace tovimar

@@ -34,7 +34,8 @@ std::string CHelpPrjTree::GetHHCStr(bool vfForceContentsRebuild) {
                       "<UL>\r\n";
     if (root_ != nullptr)
         out += root_->HHCStr(1, /*vfSkipSerializers=*/true, vfForceContentsRebuild);
-    return out + "</UL>\r\n</BODY>\r\n</HTML>\r\n";
+    out += "</UL>\r\n</BODY>\r\n</HTML>\r\n";
+    return out;
 }
 
 ResultCode CHelpPrjTree::MakeAndSaveHHK(const std::string& vstrHHKFileFullPath) {

@@ -248,7 +248,10 @@ private:
     void LoadIndexes();
     void AddIndexesText(std::string_view text);
     void ExpandProjectGroup(CHelpPrjTree& tree, IXmlSerializer& serializer);
-    void AppendFragment(CHelpPrjTree& tree, const std::string& fragment, const std::string& projectName);
+    void ReadFragment(CHelpPrjTree& tree, const std::string& fragment, const std::string& projectName);
+    void AppendFragment(CHelpPrjTree& tree, const std::string& fragment,
+                        const std::shared_ptr<XmlDocument>& document, const XmlNode& element,
+                        const std::string& projectName);
     const CHelpPrjTreeNode* FindByNameAndTag(const std::string& name, const std::string& tag,
                                              bool needsFile) const;
 

@@ -25,6 +25,22 @@ const char* Word(bool value) {
     return value ? "True" : "False";
 }
 
+/// The elements of all fragments in one document, since every document takes a page of 32 KiB. Empty when one
+/// of them is damaged; each is then read by itself.
+std::pair<std::shared_ptr<XmlDocument>, std::vector<XmlNode>>
+ReadTogether(const KeyedList<std::string>& fragments) {
+    std::string all = "<Objects>";
+    for (const auto& fragment : fragments)
+        all += fragment;
+    auto document = std::make_shared<XmlDocument>();
+    if (CXMLFile().LoadXml(all + "</Objects>", *document) != kSuccess)
+        return {};
+    auto elements = document->documentElement().childElements();
+    if (elements.size() != fragments.Count())
+        return {};
+    return {std::move(document), std::move(elements)};
+}
+
 } // namespace
 
 void CHelpPrjTreeNode::ExpandSerializerNodes(IClassFactory& rIClassFactory, CHelpPrjTree& robjTree,
@@ -81,26 +97,39 @@ void CHelpPrjTreeNode::ExpandSerializerNodes4CurrentProject(CHelpPrjTree& robjTr
     if (rprj == nullptr || Parent == nullptr)
         return;
     const std::string projectName = robjTree.SourceProjectName();
-    for (const auto& fragment : rIXML.XmlCollection(robjTree, *rprj))
+    const auto fragments = rIXML.XmlCollection(robjTree, *rprj);
+    const auto [document, elements] = ReadTogether(fragments);
+    for (std::size_t i = 0; i < fragments.Count(); ++i)
         // One object that doesn't come through must not cost the others.
-        Trapped("CHelpPrjTreeNode", "ExpandSerializerNodes4CurrentProject",
-                [&] { AppendFragment(robjTree, fragment, projectName); });
+        Trapped("CHelpPrjTreeNode", "ExpandSerializerNodes4CurrentProject", [&] {
+            const auto& fragment = fragments.At(i + 1);
+            if (document != nullptr)
+                AppendFragment(robjTree, fragment, document, elements[i], projectName);
+            else
+                ReadFragment(robjTree, fragment, projectName);
+        });
 }
 
-void CHelpPrjTreeNode::AppendFragment(CHelpPrjTree& tree, const std::string& fragment,
-                                      const std::string& projectName) {
-    const auto traceHead = [&](const char* step) {
-        return "ProjectName = " + projectName + ", ExpandSerializerNodes4CurrentProject(" + step + ") = ";
-    };
+void CHelpPrjTreeNode::ReadFragment(CHelpPrjTree& tree, const std::string& fragment,
+                                    const std::string& projectName) {
     auto document = std::make_shared<XmlDocument>();
     CXMLFile file;
     const auto result = file.LoadXml(fragment, *document);
     if (result != kSuccess)
         throw RaisedError(result, file.XmlParseError.reason + " in " + text::Left(fragment, 200));
+    AppendFragment(tree, fragment, document, document->documentElement(), projectName);
+}
+
+void CHelpPrjTreeNode::AppendFragment(CHelpPrjTree& tree, const std::string& fragment,
+                                      const std::shared_ptr<XmlDocument>& document, const XmlNode& element,
+                                      const std::string& projectName) {
+    const auto traceHead = [&](const char* step) {
+        return "ProjectName = " + projectName + ", ExpandSerializerNodes4CurrentProject(" + step + ") = ";
+    };
     Trace(traceHead("1") + fragment);
 
     auto node = std::make_unique<CHelpPrjTreeNode>();
-    node->Build(1, document, document->documentElement());
+    node->Build(1, document, element);
     node->HelpPrjTree = &tree;
     if (auto* agent = Session::ServerAgent())
         agent->ProgressMeterInit("Expanding node [" + node->Caption() + "]...", 2);

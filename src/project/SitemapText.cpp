@@ -21,8 +21,9 @@ bool IdentifiedByName() {
     return parameters != nullptr && parameters->IdentifyControls == 1;
 }
 
-void PrintSitemap(const std::string& path, const std::string& text) {
-    platform::Env().files->WriteFile(path, EncodePlainText(text + kCrLf));
+void PrintSitemap(const std::string& path, std::string text) {
+    text += kCrLf;
+    platform::Env().files->WriteFile(path, EncodePlainText(std::move(text)));
 }
 
 bool ExistsAndReadOnly(const std::string& path) {

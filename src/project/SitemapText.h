@@ -15,7 +15,7 @@ bool IdentifiedByName();
 
 /// Replaces the file by `text` and one line end, in the ANSI code page; a character that the page can't
 /// hold goes as a numeric reference, which the help compiler and every browser read back.
-void PrintSitemap(const std::string& path, const std::string& text);
+void PrintSitemap(const std::string& path, std::string text);
 
 /// The read-only state of a file for the detail of an error report; False for one that doesn't exist.
 bool ExistsAndReadOnly(const std::string& path);

@@ -95,8 +95,9 @@ std::string clsHHK::HHKContents() const {
                       "<UL>\r\n";
     const auto* parameters = Session::Parameters();
     if (parameters != nullptr && parameters->FillIndexFromAppObjectsAndControls)
-        out += root_->GenerateHHK(0);
-    return out + "</UL>\r\n</BODY>\r\n</HTML>\r\n";
+        root_->AppendHHK(out, 0);
+    out += "</UL>\r\n</BODY>\r\n</HTML>\r\n";
+    return out;
 }
 
 } // namespace tovimar

@@ -52,12 +52,13 @@ public:
     /// In the place of its display name; dropped when a child of that name, in any case, is there.
     void Add(std::unique_ptr<clsHHKObject> robj);
     std::string GenerateHHK(std::int32_t vlngLevel = 0) const;
+    /// The same behind a text that is long already.
+    void AppendHHK(std::string& out, std::int32_t level) const;
     void Terminate() { children_.clear(); }
     std::size_t Count() const { return children_.size(); }
 
 private:
     std::string DisplayName(const std::string& parentKey) const;
-    void Append(std::string& out, std::int32_t level) const;
     void AppendGroup(std::string& out, std::int32_t level) const;
 
     std::string displayValue_;

@@ -80,14 +80,14 @@ void clsHHKObject::Add(std::unique_ptr<clsHHKObject> robj) {
 
 std::string clsHHKObject::GenerateHHK(std::int32_t vlngLevel) const {
     std::string out;
-    Append(out, vlngLevel);
+    AppendHHK(out, vlngLevel);
     return out;
 }
 
-void clsHHKObject::Append(std::string& out, std::int32_t level) const {
+void clsHHKObject::AppendHHK(std::string& out, std::int32_t level) const {
     if (IsRoot && !children_.empty()) {
         for (const auto& [name, child] : children_)
-            child->Append(out, level + 1);
+            child->AppendHHK(out, level + 1);
         return;
     }
     if (!children_.empty()) {
@@ -123,7 +123,7 @@ void clsHHKObject::AppendGroup(std::string& out, std::int32_t level) const {
     AppendClose(out, indent);
     out += indent + "<UL>" + kCrLf;
     for (const auto& [name, child] : children_)
-        child->Append(out, level + 1);
+        child->AppendHHK(out, level + 1);
     out += indent + "</UL>" + kCrLf;
     AppendClose(out, indent);
 }
