@@ -1,5 +1,6 @@
 #include "cli/Console.h"
 
+#include "cli/Question.h"
 #include "foundation/ShowMessage.h"
 #include "platform/MessageBoxAnswers.h"
 #include "platform/text/Text.h"
@@ -70,6 +71,14 @@ void PrintHint(const std::string& text) {
 void PrintResult(const std::string& text) {
     Print(stdout, "", text);
 }
+void PrintPrompt(const std::string& text) {
+    std::fprintf(stderr, "%s ", Printable(text).c_str());
+    std::fflush(stderr);
+}
+void PrintRaw(const std::string& bytes) {
+    std::fwrite(bytes.data(), 1, bytes.size(), stdout);
+    std::fflush(stdout);
+}
 
 ProgressLine::ProgressLine(bool verbose) : terminal_(isatty(STDERR_FILENO) != 0), verbose_(verbose) {}
 
@@ -116,24 +125,35 @@ void ProgressLine::Clear() {
     drawn_ = false;
 }
 
+void ConsoleMessageBoxes::Tell(const std::string& text, std::uint32_t flags) {
+    const std::uint32_t icon = flags & kIcons;
+    if (icon == kMsgCritical || (warningsStop && (icon == kMsgExclamation || icon == 0))) {
+        PrintError(text);
+        ++errors;
+    } else if (icon == kMsgExclamation || icon == kMsgQuestion)
+        PrintWarning(text);
+    else
+        PrintResult(text);
+}
+
 int ConsoleMessageBoxes::Show(const std::string& text, std::uint32_t flags, const std::string&) {
     progress_.Clear();
     const bool report = OffersReport(text);
     const std::string native = NativePathsInText(report && !verbose_ ? Shortened(text) : text);
-    const std::uint32_t icon = flags & kIcons;
-    if (icon == kMsgCritical || (warningsStop && (icon == kMsgExclamation || icon == 0))) {
-        PrintError(native);
-        ++errors;
-    } else if (icon == kMsgExclamation || icon == kMsgQuestion)
-        PrintWarning(native);
-    else
-        PrintResult(native);
-    if (report)
-        return platform::kAnswerNo;
+    if (report || (flags & kButtons) == kMsgOk) {
+        Tell(native, flags);
+        return report ? platform::kAnswerNo : platform::kAnswerOk;
+    }
+    if (mayAsk_)
+        return AskOnTerminal(native, flags);
     // Going on over a locked file would only fail later.
-    if ((flags & kButtons) == kMsgOkCancel && warningsStop)
+    if ((flags & kButtons) == kMsgOkCancel && warningsStop) {
+        Tell(native, flags);
         return platform::kAnswerCancel;
-    return platform::DefaultMessageBoxAnswer(flags);
+    }
+    const int answer = platform::DefaultMessageBoxAnswer(flags);
+    PrintWarning(native + "\n(answered by itself: " + AnswerWord(answer) + ")");
+    return answer;
 }
 
 } // namespace tovimar::cli

@@ -13,8 +13,12 @@ void PrintError(const std::string& text);
 void PrintWarning(const std::string& text);
 /// Without a prefix, on standard error.
 void PrintHint(const std::string& text);
+/// On standard error, and the line stays open for an answer.
+void PrintPrompt(const std::string& text);
 /// On standard output.
 void PrintResult(const std::string& text);
+/// On standard output, byte by byte.
+void PrintRaw(const std::string& bytes);
 
 /// On a terminal one line with a bar that is written over and over; elsewhere a line per phase, and with
 /// `verbose` one per object.
@@ -41,11 +45,12 @@ private:
     std::string bar_;
 };
 
-/// Boxes nobody can answer: the text is printed, the default button answers, and what would leave the
-/// program, such as a mail with a report, is declined.
+/// Boxes are printed. One with a choice is asked on the terminal when there is somebody to answer; else its
+/// default button answers. What would leave the program, such as a mail with a report, is declined.
 class ConsoleMessageBoxes : public platform::MessageBoxes {
 public:
-    ConsoleMessageBoxes(ProgressLine& progress, bool verbose) : progress_(progress), verbose_(verbose) {}
+    ConsoleMessageBoxes(ProgressLine& progress, bool verbose, bool mayAsk)
+        : progress_(progress), verbose_(verbose), mayAsk_(mayAsk) {}
     int Show(const std::string& text, std::uint32_t flags, const std::string& title) override;
 
     /// Warnings are why the program stops, as long as this is set.
@@ -54,8 +59,11 @@ public:
     int errors = 0;
 
 private:
+    void Tell(const std::string& text, std::uint32_t flags);
+
     ProgressLine& progress_;
     bool verbose_;
+    bool mayAsk_;
 };
 
 /// The progress window's messages, which change with every field of a table.

@@ -1,3 +1,4 @@
+#include "cli/Columns.h"
 #include "cli/Commands.h"
 #include "cli/Console.h"
 #include "platform/access/AccessApplication.h"
@@ -12,11 +13,6 @@ namespace {
 using platform::access::ApplicationSummary;
 using platform::access::ObjectKind;
 using platform::access::ObjectSummary;
-
-std::string PaddedTo(std::string text, std::size_t width) {
-    const std::size_t length = text::Length(text);
-    return length < width ? text + std::string(width - length, ' ') : text;
-}
 
 void ShowKind(const ApplicationSummary& application, ObjectKind kind, const char* heading) {
     std::vector<const ObjectSummary*> objects;

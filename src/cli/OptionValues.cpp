@@ -74,40 +74,57 @@ bool IsPlainName(const std::string& value) {
            std::none_of(name.begin(), name.end(), [](char c) { return static_cast<unsigned char>(c) < 32; });
 }
 
-} // namespace
-
-OptionAssignment ParseOption(const std::string& assignment) {
-    OptionAssignment parsed;
-    const auto sign = assignment.find('=');
-    if (sign == std::string::npos || sign == 0) {
-        parsed.complaint = "--option needs NAME=VALUE, not '" + assignment + "'";
-        return parsed;
-    }
-    const std::string name = assignment.substr(0, sign);
-    parsed.value = assignment.substr(sign + 1);
+/// Null for an unknown name.
+const OptionDescription* Described(const std::string& name) {
     const auto& all = OptionDescriptions();
     const auto option = std::find_if(all.begin(), all.end(), [&](const OptionDescription& candidate) {
         return text::EqualsIgnoringCase(candidate.name, name);
     });
-    if (option == all.end()) {
-        parsed.complaint = UnknownName(name);
+    return option == all.end() ? nullptr : &*option;
+}
+
+std::string ComplaintAboutText(const std::string& name, const std::string& value) {
+    const bool namesFile = name == "HelpProjectName" || name == "SubFolderForScreenshots";
+    if (!text::IsValidUtf8(value))
+        return "the value of " + name + " isn't UTF-8";
+    if (namesFile && !IsPlainName(value))
+        return "'" + value + "' can't be the name of a file, as " + name + " needs it";
+    return {};
+}
+
+} // namespace
+
+OptionAssignment FindOption(const std::string& name) {
+    OptionAssignment found;
+    if (const auto* option = Described(name))
+        found.name = option->name;
+    else
+        found.complaint = UnknownName(name);
+    return found;
+}
+
+OptionAssignment ParseOption(const std::string& assignment) {
+    const auto sign = assignment.find('=');
+    if (sign != std::string::npos && sign > 0)
+        return ParseOption(assignment.substr(0, sign), assignment.substr(sign + 1));
+    OptionAssignment parsed;
+    parsed.complaint = "--option needs NAME=VALUE, not '" + assignment + "'";
+    return parsed;
+}
+
+OptionAssignment ParseOption(const std::string& name, const std::string& value) {
+    OptionAssignment parsed = FindOption(name);
+    if (!parsed.complaint.empty())
         return parsed;
-    }
-    parsed.name = option->name;
-    const bool namesFile = parsed.name == "HelpProjectName" || parsed.name == "SubFolderForScreenshots";
-    if (std::string_view(option->values).empty()) {
-        if (!text::IsValidUtf8(parsed.value))
-            parsed.complaint = "the value of " + parsed.name + " isn't UTF-8";
-        else if (namesFile && !IsPlainName(parsed.value))
-            parsed.complaint =
-                "'" + parsed.value + "' can't be the name of a file, as " + parsed.name + " needs it";
-        return parsed;
-    }
-    if (const std::string fitting = Fitting(*option, parsed.value); !fitting.empty())
+    const OptionDescription& option = *Described(name);
+    parsed.value = value;
+    if (std::string_view(option.values).empty())
+        parsed.complaint = ComplaintAboutText(parsed.name, value);
+    else if (const std::string fitting = Fitting(option, value); !fitting.empty())
         parsed.value = fitting;
     else
-        parsed.complaint = "'" + parsed.value + "' is no value of " + parsed.name + ", which takes " +
-                           text::ReplaceAll(option->values, "|", " or ");
+        parsed.complaint = "'" + value + "' is no value of " + parsed.name + ", which takes " +
+                           text::ReplaceAll(option.values, "|", " or ");
     return parsed;
 }
 

@@ -4,14 +4,18 @@
 
 namespace tovimar::cli {
 
-/// One `NAME=VALUE` of the command line.
+/// An option and the value it is to have, as they were typed.
 struct OptionAssignment {
     std::string name; ///< as the option spells it
     std::string value;
     std::string complaint; ///< why it isn't understood; empty for a good one
 };
 
-/// Names ignore case. An unknown name gets the nearest ones suggested, a bad value the good ones.
+/// `NAME=VALUE`. Names ignore case. An unknown name gets the nearest ones suggested, a bad value the good
+/// ones.
 OptionAssignment ParseOption(const std::string& assignment);
+OptionAssignment ParseOption(const std::string& name, const std::string& value);
+/// The name alone.
+OptionAssignment FindOption(const std::string& name);
 
 } // namespace tovimar::cli

@@ -1,5 +1,8 @@
 #include "cli/Surroundings.h"
 
+#include "cli/CommandLine.h"
+#include "cli/Question.h"
+#include "cli/Viewer.h"
 #include "foundation/Paths.h"
 #include "foundation/Session.h"
 #include "platform/Interrupt.h"
@@ -97,6 +100,8 @@ std::unique_ptr<platform::Environment> MakeEnvironment() {
     if (const fs::path folder = FindCompiler(program); !folder.empty())
         registry->Install(kCompilerKey, {}, environment->files->FromNative((folder / "hhw.exe").string()));
     environment->registry = std::move(registry);
+    environment->processes = ShowingProcesses(std::move(environment->processes));
+    environment->helpViewer = ShowingHelpViewer();
     environment->doEvents = [] {
         if (platform::InterruptRequested())
             Session::Run().generationInterrupted = true;
@@ -106,10 +111,11 @@ std::unique_ptr<platform::Environment> MakeEnvironment() {
 
 } // namespace
 
-Surroundings::Surroundings(bool verbose) : progress_(verbose) {
+Surroundings::Surroundings(const Arguments& arguments)
+    : progress_(arguments.verbose), asks_(HasTerminal() && !arguments.yes && !arguments.json) {
     platform::InstallInterruptHandler();
     auto environment = MakeEnvironment();
-    auto boxes = std::make_unique<ConsoleMessageBoxes>(progress_, verbose);
+    auto boxes = std::make_unique<ConsoleMessageBoxes>(progress_, arguments.verbose, asks_);
     boxes_ = boxes.get();
     environment->messageBoxes = std::move(boxes);
     environment->progressWindow = std::make_unique<DetailView>(progress_);

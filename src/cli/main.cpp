@@ -12,23 +12,48 @@
 namespace tovimar::cli {
 namespace {
 
+int RunCommand(const Arguments& arguments, Surroundings& surroundings) {
+    using Command = Arguments::Command;
+    switch (arguments.command) {
+    case Command::New:
+        return CreateProject(arguments, surroundings);
+    case Command::Generate:
+        return Generate(arguments, surroundings);
+    case Command::Recompile:
+        return Recompile(arguments, surroundings);
+    case Command::Screenshot:
+        return RetakeScreenshot(arguments, surroundings);
+    case Command::Open:
+        return Open(arguments, surroundings);
+    case Command::ListProjects:
+        return ListProjects(arguments);
+    case Command::ForgetProject:
+        return ForgetProject(arguments, surroundings);
+    case Command::Contents:
+        return ShowContents(arguments, surroundings);
+    case Command::ListSettings:
+        return ListSettings(arguments, surroundings);
+    case Command::GetSetting:
+        return GetSetting(arguments, surroundings);
+    case Command::SetSetting:
+        return SetSetting(arguments, surroundings);
+    case Command::List:
+        return List(arguments);
+    case Command::ConvertContents:
+        return ConvertContents(arguments, surroundings);
+    default:
+        return ShowOptions();
+    }
+}
+
 int Run(const Arguments& arguments) {
-    Surroundings surroundings(arguments.verbose);
+    Surroundings surroundings(arguments);
     try {
         if (const std::string missing = surroundings.MissingInstallation(); !missing.empty()) {
             PrintError(missing);
             return kFailed;
         }
-        switch (arguments.command) {
-        case Arguments::Command::Generate:
-            return Generate(arguments, surroundings);
-        case Arguments::Command::Screenshot:
-            return RetakeScreenshot(arguments, surroundings);
-        case Arguments::Command::List:
-            return List(arguments);
-        default:
-            return ShowOptions();
-        }
+        return RunCommand(arguments, surroundings);
     } catch (const std::exception& failure) {
         surroundings.Progress().Clear();
         if (platform::InterruptRequested()) {

@@ -1,0 +1,71 @@
+#include "cli/HelpFiles.h"
+
+#include "cli/CommandLine.h"
+#include "cli/Console.h"
+#include "cli/Stop.h"
+#include "foundation/CAddInProject.h"
+#include "foundation/Session.h"
+#include "generation/CTovimar.h"
+#include "generation/CTovimarCompiler.h"
+#include "generation/HelpUtilities.h"
+#include "host/server/CTovimarServer.h"
+#include "platform/Environment.h"
+#include "platform/files/Paths.h"
+#include "platform/text/Text.h"
+
+namespace tovimar::cli {
+
+void CheckCompiler() {
+    if (!Session::Parameters()->CompileHTMLHelp)
+        return;
+    if (GetHtmlHelpWorkshopExePath().empty())
+        throw Stop{
+            "the help compiler isn't installed; nothing was written\n"
+            "Install the Debian package fp-utils (it has chmcmd), or pass --no-compile to write everything "
+            "but the .chm."};
+    TheServer().TestThatHtmlWorkshopInstalled();
+}
+
+std::string CopyComplaint(const Arguments& arguments) {
+    if (!Session::Parameters()->CompileHTMLHelp)
+        return {};
+    auto& files = *platform::Env().files;
+    const std::string copied = platform::FolderOf(CTovimarCompiler().GetCopiedHelpFullPath());
+    if (!arguments.copyTo.empty() && !CreateFolderPath(copied))
+        return "the folder '" + files.ToNative(copied) + "' of --copy-to can't be made";
+    if (!TestFolderWritable(copied))
+        return "no write access to '" + files.ToNative(copied) +
+               "', where the copy of the compiled help goes\n--copy-to names another folder, --no-compile "
+               "makes none.";
+    return {};
+}
+
+bool CompilerSucceeded(bool verbose) {
+    const auto& generator = *Session::Generator();
+    const bool compiled = platform::Env().files->FileExists(Session::Parameters()->CompiledHelpFullPath());
+    if (Session::Parameters()->CompileHTMLHelp && (!compiled || generator.CompilerExitCode != 0)) {
+        PrintError((compiled ? "the help compiler had complaints:\n" : "the help compiler made no file:\n") +
+                   generator.CompilerOutput);
+        return false;
+    }
+    if (verbose && !generator.CompilerOutput.empty())
+        PrintHint(generator.CompilerOutput);
+    return true;
+}
+
+void ShowCompiledHelp() {
+    if (!Session::Parameters()->CompileHTMLHelp)
+        return;
+    const std::string compiled = Session::Parameters()->CompiledHelpFullPath();
+    const std::string copied = CTovimarCompiler().GetCopiedHelpFullPath();
+    ShowFile("Compiled help: ", compiled);
+    if (!text::EqualsIgnoringCase(compiled, copied))
+        ShowFile("Copied to:     ", copied);
+}
+
+void ShowWebHelpAndProject() {
+    ShowFile("Web help:      ", platform::Join(Session::CurrentProject()->Folder, "main.htm"));
+    ShowFile("Project:       ", Session::CurrentProject()->TvpFullPath());
+}
+
+} // namespace tovimar::cli

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "host/server/CTovimarClient.h"
+#include "platform/AutomationObject.h"
+
+#include <string>
+
+namespace tovimar::cli {
+
+struct Arguments;
+class Surroundings;
+
+/// Windows path of the application that the catalogue remembers for a project. Raises `Stop` when it doesn't
+/// know it.
+std::string RememberedSource(const std::string& projectFile);
+/// Raises `Stop` when it isn't there any more.
+HostObject OpenRemembered(const std::string& source);
+
+/// A help project and the application that it was made from, for the commands that work on a help that
+/// exists. Raises `Stop` where one of the two can't be had.
+class ProjectSource {
+public:
+    ProjectSource(const Arguments& arguments, Surroundings& surroundings);
+
+    /// Windows path of the project file.
+    const std::string& ProjectFile() const { return projectFile_; }
+    /// Native path of the application; empty before `Open`.
+    const std::string& Source() const { return source_; }
+    /// Reads the application, the one of --source or the one that the catalogue remembers, and connects to
+    /// it.
+    void Open();
+
+private:
+    HostObject OpenApplication();
+
+    const Arguments& arguments_;
+    Surroundings& surroundings_;
+    std::string projectFile_;
+    std::string source_;
+    CTovimarClient client_;
+};
+
+} // namespace tovimar::cli
