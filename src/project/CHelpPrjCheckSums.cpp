@@ -69,12 +69,15 @@ ResultCode CHelpPrjCheckSums::Init(const std::string& vstrTvpFolder,
 
 void CHelpPrjCheckSums::ReadFile() {
     auto& files = *platform::Env().files;
-    if (files.FileExists(checkSumFile_)) {
-        const auto lines = LinesOf(text::AnsiCodePage().Decode(files.ReadFile(checkSumFile_)));
-        for (std::size_t i = 1; i < lines.size(); ++i)
-            ReadLine(lines[i]);
-    }
+    if (files.FileExists(checkSumFile_))
+        ReadBytes(files.ReadFile(checkSumFile_));
     initialized_ = true;
+}
+
+void CHelpPrjCheckSums::ReadBytes(const std::string& bytes) {
+    const auto lines = LinesOf(text::AnsiCodePage().Decode(bytes));
+    for (std::size_t i = 1; i < lines.size(); ++i)
+        ReadLine(lines[i]);
 }
 
 void CHelpPrjCheckSums::ReadLine(const std::string& line) {

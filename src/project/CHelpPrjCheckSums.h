@@ -45,6 +45,10 @@ public:
     /// 0x80040001 for an empty folder or name. Right after it no page counts as changed.
     ResultCode Init(const std::string& vstrTvpFolder, const std::string& vstrCheckSumFileFolder,
                     const std::string& vstrCheckSumFileName);
+    /// The records of a checksum file's bytes; lines that are none are passed over.
+    void ReadBytes(const std::string& bytes);
+    /// The checksum file as `Save` writes it.
+    std::string FileText(bool vfSaveCurrentCheckSum);
     /// An edited page is accepted only with `vfSaveCurrentCheckSum`; a page new to the list always.
     ResultCode Save(bool vfSaveCurrentCheckSum = false);
     /// File names in the pages' folder; without a list all "*.htm" files.
@@ -56,7 +60,6 @@ public:
 private:
     void ReadFile();
     void ReadLine(const std::string& line);
-    std::string FileText(bool saveCurrent);
 
     std::string checkSumFile_;
     std::string folder_;

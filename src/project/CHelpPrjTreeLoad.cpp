@@ -62,7 +62,7 @@ struct CHelpPrjTree::LoadRun {
         return *withoutQueries;
     }
 
-    bool LeavesOut(const std::string& tag) {
+    bool LeavesOut(std::string_view tag) {
         const auto* parameters = Session::Parameters();
         const auto on = [&](bool CTovimarParameters::*flag) {
             return parameters == nullptr || parameters->*flag;
@@ -103,9 +103,14 @@ ResultCode CHelpPrjTree::LoadTree(LoadRun& run, const std::string& xml) {
     Trace("CHelpPrjTree.Load(1): " + Now());
     document_ = run.document;
     if (run.rootElement) {
+        const auto start = platform::Env().clock->Timer();
         result = BuildXmlNodes(run, 1, run.rootElement, nullptr);
         if (result != kSuccess)
             return result;
+        run.buildTimeTotal = platform::Env().clock->Timer() - start;
+        Trace("CHelpPrjTree.BuildXmlNodes(2): " + Now() +
+              ", BuildTimeTotal = " + Seconds(run.buildTimeTotal - run.addControlsTimeTotal) +
+              ", AddControlsTimeTotal = " + Seconds(run.addControlsTimeTotal));
     }
     // The piece of a copied subtree has no pages of its own to watch.
     if (xml.empty()) {
@@ -132,8 +137,6 @@ ResultCode CHelpPrjTree::LoadDocument(LoadRun& run, const std::string& xml) {
 
 ResultCode CHelpPrjTree::BuildXmlNodes(LoadRun& run, std::int32_t level, const XmlNode& element,
                                        CHelpPrjTreeNode* parent) {
-    auto& clock = *platform::Env().clock;
-    const auto start = clock.Timer();
     if (level == 1)
         Trace("CHelpPrjTree.BuildXmlNodes(1): " + Now());
     auto built = std::make_unique<CHelpPrjTreeNode>();
@@ -147,23 +150,18 @@ ResultCode CHelpPrjTree::BuildXmlNodes(LoadRun& run, std::int32_t level, const X
     if (node == nullptr)
         return kSuccess;
     if (run.loadControls && IsObjectTag(node->Tag)) {
-        const auto controlsStart = clock.Timer();
+        auto& clock = *platform::Env().clock;
+        const auto start = clock.Timer();
         auto controlLevel = level;
         AddControls(*node, controlLevel, run.external, run.path);
-        run.addControlsTimeTotal += clock.Timer() - controlsStart;
+        run.addControlsTimeTotal += clock.Timer() - start;
     }
-    for (const auto& child : element.childElements()) {
-        if (run.LeavesOut(child.nodeName()))
+    for (auto child = element.firstChild(); child; child = child.nextSibling()) {
+        if (!child.IsElement() || run.LeavesOut(child.tagName()))
             continue;
         const auto result = BuildXmlNodes(run, level + 1, child, node);
         if (result != kSuccess)
             return result;
-    }
-    if (level == 1) {
-        run.buildTimeTotal += clock.Timer() - start;
-        Trace("CHelpPrjTree.BuildXmlNodes(2): " + Now() +
-              ", BuildTimeTotal = " + Seconds(run.buildTimeTotal - run.addControlsTimeTotal) +
-              ", AddControlsTimeTotal = " + Seconds(run.addControlsTimeTotal));
     }
     return kSuccess;
 }
@@ -171,9 +169,16 @@ ResultCode CHelpPrjTree::BuildXmlNodes(LoadRun& run, std::int32_t level, const X
 /// Null when the node's key couldn't be made unique; its subtree is left out with it.
 CHelpPrjTreeNode* CHelpPrjTree::PlaceBuiltNode(std::int32_t level, CHelpPrjTreeNode* parent,
                                                std::unique_ptr<CHelpPrjTreeNode> node) {
-    if (level > 1)
-        return addItem(parent, std::move(node), /*vfAutoUniqueKey=*/true, nullptr, nullptr,
-                       /*vfAddChildNodesToMap=*/true);
+    if (level > 1) {
+        // The plain case of `addItem`, many thousand times in a load.
+        auto& made = *node;
+        made.HelpPrjTree = this;
+        if (!map_.Add(&made, made.Key()))
+            return addItem(parent, std::move(node), /*vfAutoUniqueKey=*/true, nullptr, nullptr,
+                           /*vfAddChildNodesToMap=*/true);
+        PlaceAmongSiblings(*parent, std::move(node), nullptr, nullptr, false, false);
+        return &made;
+    }
     Reset();
     root_ = std::move(node);
     root_->IsRootNode = true;
@@ -241,7 +246,7 @@ ResultCode CHelpPrjTree::SaveXml(const std::string& vstrXmlFileFullPath, bool vf
             const auto text = ProjectFileText(vfSkipSerializers, vstrExtraAttrs);
             readOnly = ExistsAndReadOnly(vstrXmlFileFullPath);
             CXMLFile file;
-            const auto result = file.SaveXml(vstrXmlFileFullPath, text);
+            const auto result = file.SaveXml(vstrXmlFileFullPath, text, Durability::OnDisk);
             if (result == kSuccess)
                 return;
             Trace(text);

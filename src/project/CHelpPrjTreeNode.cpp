@@ -39,7 +39,7 @@ bool CHelpPrjTreeNode::Build(std::int32_t vlngLevel, std::shared_ptr<XmlDocument
 std::string CHelpPrjTreeNode::PropertyValue(NodeProperty property) const {
     if (terminated_)
         return {};
-    auto value = properties_.Read(property);
+    std::string value(properties_.Read(property));
     auto* parameters = Session::Parameters();
     if (value.find('{') == std::string::npos || Session::Server() == nullptr || parameters == nullptr)
         return value;

@@ -2,6 +2,7 @@
 
 #include "platform/Error.h"
 #include "platform/KeyedList.h"
+#include "project/NodeList.h"
 #include "project/NodeProperties.h"
 
 #include <cstdint>
@@ -33,7 +34,7 @@ enum class TreeViewRelation;
 /// reference that somebody still holds doesn't dangle.
 class CHelpPrjTreeNode {
 public:
-    using ChildList = KeyedList<std::unique_ptr<CHelpPrjTreeNode>>;
+    using ChildList = NodeList;
 
     CHelpPrjTreeNode();
     ~CHelpPrjTreeNode();
@@ -230,14 +231,19 @@ private:
     void Release();
     void ReleaseSubtree();
     std::unique_ptr<CHelpPrjTreeNode> TakeChild(const CHelpPrjTreeNode& child);
-    void RekeyChildren();
     void ShowInView(bool displayChildrenOnly, ITreeViewNode* parent, ITreeViewNode* previous,
                     ITreeViewNode* next, bool beforePrevious, bool afterNext);
     std::string DisplayCaption() const;
-    void AppendXml(std::string& out, std::int32_t level, bool skipSerializers,
+    struct XmlPass;
+    void NoteNeighbours();
+    void AppendXml(XmlPass& pass, std::int32_t level, const std::string& encodedParentKey,
                    const std::string& extraAttributes);
-    void AppendXmlFirstLine(std::string& out, bool nameIsGiven) const;
-    void AppendXmlLines(std::string& out, std::int32_t level);
+    void AppendXmlFirstLine(XmlPass& pass, const NodePropertyViews& values, bool nameIsGiven) const;
+    void AppendXmlLines(XmlPass& pass, const NodePropertyViews& values, std::int32_t level,
+                        const std::string& encodedKey, const std::string& encodedParentKey);
+    void AppendXmlIndexes(XmlPass& pass, const NodePropertyViews& values);
+    std::string_view Resolved(const NodePropertyViews& values, NodeProperty property,
+                              std::string& buffer) const;
     void AppendContents(std::string& out, std::int32_t level, ContentsStyle& style);
     void AppendObjectChildren(std::string& out, std::int32_t level, ContentsStyle& style);
     bool RenewDefinition();
@@ -246,7 +252,6 @@ private:
     bool HasContentsEntry() const;
     void AppendContentsHtml(std::string& out, std::int32_t level, bool skipControlsNodes) const;
     void LoadIndexes();
-    void AddIndexesText(std::string_view text);
     void ExpandProjectGroup(CHelpPrjTree& tree, IXmlSerializer& serializer);
     void ReadFragment(CHelpPrjTree& tree, const std::string& fragment, const std::string& projectName);
     void AppendFragment(CHelpPrjTree& tree, const std::string& fragment,
@@ -263,8 +268,8 @@ private:
     mutable std::string generatedFile_;
     mutable bool templateFileKnown_ = false;
     mutable bool generatedFileKnown_ = false;
-    KeyedList<std::string> indexes_;
-    bool indexesLoaded_ = false;
+    /// Null until they are asked for or set.
+    std::unique_ptr<KeyedList<std::string>> indexes_;
     bool terminated_ = false;
 };
 

@@ -98,7 +98,9 @@ void CHelpPrjTreeNode::ExpandSerializerNodes4CurrentProject(CHelpPrjTree& robjTr
         return;
     const std::string projectName = robjTree.SourceProjectName();
     const auto fragments = rIXML.XmlCollection(robjTree, *rprj);
-    const auto [document, elements] = ReadTogether(fragments);
+    const auto together = ReadTogether(fragments);
+    const auto& document = together.first;
+    const auto& elements = together.second;
     for (std::size_t i = 0; i < fragments.Count(); ++i)
         // One object that doesn't come through must not cost the others.
         Trapped("CHelpPrjTreeNode", "ExpandSerializerNodes4CurrentProject", [&] {
@@ -141,7 +143,7 @@ void CHelpPrjTreeNode::AppendFragment(CHelpPrjTree& tree, const std::string& fra
         return;
     node->SetKey(key);
     auto& placed = *node;
-    Parent->children_.Add(std::move(node), key);
+    Parent->children_.Add(std::move(node));
     tree.AddToMap(placed);
     tree.Index().Added(placed);
     if (Session::TraceLog()->IsOn())

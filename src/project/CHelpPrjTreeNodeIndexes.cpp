@@ -1,6 +1,5 @@
 #include "foundation/CAddInProject.h"
 #include "foundation/Session.h"
-#include "foundation/TextEncodings.h"
 #include "platform/Environment.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
@@ -15,58 +14,34 @@ namespace tovimar {
 namespace {
 
 constexpr int kMostKeywordAttributes = 100;
-/// A chunk that is longer than this is written before the next word.
-constexpr std::size_t kChunkCharacters = 80;
+
+void AddWords(KeyedList<std::string>& list, std::string_view text) {
+    for (const auto& word : text::Split(text, "|"))
+        if (!word.empty() && !list.Contains(word))
+            list.Add(word, word);
+}
 
 } // namespace
 
 KeyedList<std::string>& CHelpPrjTreeNode::IndexesCollection() {
-    if (!indexesLoaded_)
+    if (indexes_ == nullptr)
         LoadIndexes();
-    return indexes_;
+    return *indexes_;
 }
 
 void CHelpPrjTreeNode::SetIndexesCollection(KeyedList<std::string> words) {
-    indexes_ = std::move(words);
-    indexesLoaded_ = true;
+    indexes_ = std::make_unique<KeyedList<std::string>>(std::move(words));
 }
 
 void CHelpPrjTreeNode::LoadIndexes() {
-    indexesLoaded_ = true;
-    AddIndexesText(properties_.ReadAttribute("Indexes"));
+    indexes_ = std::make_unique<KeyedList<std::string>>();
+    AddWords(*indexes_, properties_.ReadAttribute("Indexes"));
     for (int number = 1; number <= kMostKeywordAttributes; ++number) {
         const auto text = properties_.ReadAttribute("Indexes" + std::to_string(number));
         if (text.empty())
             return;
-        AddIndexesText(text);
+        AddWords(*indexes_, text);
     }
-}
-
-void CHelpPrjTreeNode::AddIndexesText(std::string_view text) {
-    for (const auto& word : text::Split(text, "|"))
-        if (!word.empty() && !indexes_.Contains(word))
-            indexes_.Add(word, word);
-}
-
-std::string CHelpPrjTreeNode::IndexesXmlStr() {
-    std::string out;
-    std::string chunk;
-    int number = 0;
-    const auto writeChunk = [&] {
-        out += "  Indexes" + (number == 0 ? std::string() : std::to_string(number)) + " = \"" + chunk + "\" ";
-        chunk.clear();
-        ++number;
-    };
-    for (const auto& word : IndexesCollection()) {
-        if (text::Length(chunk) > kChunkCharacters)
-            writeChunk();
-        if (!chunk.empty())
-            chunk += '|';
-        chunk += EncodeSpecialChars(word);
-    }
-    if (!chunk.empty())
-        writeChunk();
-    return out;
 }
 
 void CHelpPrjTreeNode::AddIndexLinks(clsHHK& robjIndex) {

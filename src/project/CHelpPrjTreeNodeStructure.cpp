@@ -11,16 +11,6 @@
 /// Children, removal and the keys of copied subtrees.
 namespace tovimar {
 
-namespace {
-
-/// A key that is taken can't be the reason to lose a node.
-void AddKeyed(CHelpPrjTreeNode::ChildList& list, std::unique_ptr<CHelpPrjTreeNode> node) {
-    const auto key = node->Key();
-    list.Add(std::move(node), list.Contains(key) ? std::string() : key);
-}
-
-} // namespace
-
 std::int32_t CHelpPrjTreeNode::NodesQty() const {
     std::int32_t count = 0;
     for (const auto& child : children_)
@@ -53,10 +43,10 @@ void CHelpPrjTreeNode::RemoveKeysFromKeyMap() {
 
 void CHelpPrjTreeNode::Release() {
     properties_.Release();
-    indexes_.Clear();
+    indexes_.reset();
     templateFile_.clear();
     generatedFile_.clear();
-    templateFileKnown_ = generatedFileKnown_ = indexesLoaded_ = true;
+    templateFileKnown_ = generatedFileKnown_ = true;
     TreeView = nullptr;
     TreeViewNode = nullptr;
     Parent = nullptr;
@@ -98,20 +88,15 @@ void CHelpPrjTreeNode::Terminate() {
 }
 
 std::unique_ptr<CHelpPrjTreeNode> CHelpPrjTreeNode::TakeChild(const CHelpPrjTreeNode& child) {
-    auto position = children_.PositionOf(child.Key());
-    if (position == 0 || children_.At(position).get() != &child) {
-        position = 1;
-        while (position <= children_.Count() && children_.At(position).get() != &child)
-            ++position;
-    }
-    return position > children_.Count() ? nullptr : children_.TakeAt(position);
+    const auto position = children_.PositionOf(child);
+    return position == 0 ? nullptr : children_.TakeAt(position);
 }
 
 void CHelpPrjTreeNode::DropChildrenControls() {
     ChildList kept;
     for (auto& entry : std::exchange(children_, ChildList())) {
         if (!entry->IsControl && !entry->IsMenu) {
-            AddKeyed(kept, std::move(entry));
+            kept.Add(std::move(entry));
             continue;
         }
         entry->ReleaseSubtree();
@@ -136,13 +121,6 @@ void CHelpPrjTreeNode::ClearChildrenCollection(bool vfKeepChildrenNodes) {
             child->HelpPrjTree->RemoveFromMap(*child);
         formerChildren_.push_back(std::move(child));
     }
-}
-
-void CHelpPrjTreeNode::RekeyChildren() {
-    ChildList rekeyed;
-    for (auto& child : std::exchange(children_, ChildList()))
-        AddKeyed(rekeyed, std::move(child));
-    children_ = std::move(rekeyed);
 }
 
 std::string CHelpPrjTreeNode::GeneratedKeySuffix() {
@@ -195,7 +173,6 @@ void CHelpPrjTreeNode::AssignNewKeyIfDuplicate(CHelpPrjTree* robjHelpPrjTree) {
     SetKey(FreeKey(*tree, KeyBase(Key())));
     for (const auto& child : children_)
         child->AssignNewKeyIfDuplicate(robjHelpPrjTree);
-    RekeyChildren();
 }
 
 void CHelpPrjTreeNode::AssignNewKeysToAllNodesIfDuplicateInANewTree(CHelpPrjTree* robjTreeView2Merge,
@@ -206,7 +183,6 @@ void CHelpPrjTreeNode::AssignNewKeysToAllNodesIfDuplicateInANewTree(CHelpPrjTree
         if (!(vfSkipSerializers && child->HasSerializer()))
             child->AssignNewKeysToAllNodesIfDuplicateInANewTree(robjTreeView2Merge, vfSkipSerializers);
     }
-    RekeyChildren();
 }
 
 CHelpPrjTreeNode* CHelpPrjTreeNode::Paste(std::unique_ptr<CHelpPrjTreeNode> node,

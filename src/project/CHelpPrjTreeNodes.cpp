@@ -64,12 +64,10 @@ CHelpPrjTreeNode* CHelpPrjTree::addItem(CHelpPrjTreeNode* robjXMLParent,
                                         CHelpPrjTreeNode* robjXmlPrevious, CHelpPrjTreeNode* robjXmlNext,
                                         bool vfAddChildNodesToMap, bool vfBeforePrevious, bool vfAfterNext) {
     CHelpPrjTreeNode* placed = nullptr;
-    std::string detail;
     Trapped(
         "CHelpPrjTree", "addItem",
         [&] {
             auto& node = *robjXml;
-            detail = "Tag = " + node.Tag + ", Name = " + node.Name() + ", Caption = " + node.Caption();
             MakeKeyUnique(node, vfAutoUniqueKey);
             node.HelpPrjTree = this;
             if (robjXMLParent != nullptr) {
@@ -83,7 +81,12 @@ CHelpPrjTreeNode* CHelpPrjTree::addItem(CHelpPrjTreeNode* robjXMLParent,
                 AddChildNodesToMap(node);
             placed = &node;
         },
-        [&] { return detail + ", MapKey = " + (robjXml == nullptr ? std::string() : robjXml->Key()); });
+        [&] {
+            if (robjXml == nullptr)
+                return std::string();
+            return "Tag = " + robjXml->Tag + ", Name = " + robjXml->Name() +
+                   ", Caption = " + robjXml->Caption() + ", MapKey = " + robjXml->Key();
+        });
     return placed;
 }
 
@@ -94,7 +97,7 @@ void CHelpPrjTree::PlaceAmongSiblings(CHelpPrjTreeNode& parent, std::unique_ptr<
     made.Parent = &parent;
     const auto* sibling = previous != nullptr ? previous : next;
     if (sibling == nullptr) {
-        parent.children_.Add(std::move(node), made.Key());
+        parent.children_.Add(std::move(node));
         index_.Added(made);
         return;
     }
@@ -105,7 +108,7 @@ void CHelpPrjTree::PlaceAmongSiblings(CHelpPrjTreeNode& parent, std::unique_ptr<
         return;
     }
     const bool behind = previous != nullptr ? !beforePrevious : afterNext;
-    parent.children_.Insert(behind ? position + 1 : position, std::move(node), made.Key());
+    parent.children_.Insert(behind ? position + 1 : position, std::move(node));
     index_.Added(made);
 }
 

@@ -1,9 +1,10 @@
 #include "project/NodeProperties.h"
 
+#include "platform/text/CodePoints.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
-#include <unordered_map>
+#include <utility>
 
 namespace tovimar {
 
@@ -47,14 +48,41 @@ constexpr PropertyRow kRows[] = {
 };
 static_assert(std::size(kRows) == static_cast<std::size_t>(NodeProperty::Count));
 
-const std::unordered_map<std::string_view, NodeProperty>& PropertiesByAttribute() {
-    static const auto table = [] {
-        std::unordered_map<std::string_view, NodeProperty> made;
-        for (const auto& row : kRows)
-            made.emplace(row.attribute, row.property);
-        return made;
-    }();
+constexpr std::size_t kLongestAttribute = 17;
+
+/// Positions in the table by the length of the attribute's name, each list ended by the table's size.
+constexpr auto kRowsByLength = [] {
+    std::array<std::array<std::uint8_t, 8>, kLongestAttribute + 1> table{};
+    for (auto& rows : table)
+        rows.fill(std::size(kRows));
+    for (std::size_t row = 0; row < std::size(kRows); ++row) {
+        auto& rows = table[std::string_view(kRows[row].attribute).size()];
+        *std::find(rows.begin(), rows.end(), std::size(kRows)) = static_cast<std::uint8_t>(row);
+    }
     return table;
+}();
+
+bool IsCalled(std::string_view attribute, std::string_view folded) {
+    for (std::size_t i = 0; i < attribute.size() && i < folded.size(); ++i)
+        if (!text::IsAscii(attribute[i]))
+            return text::EqualsIgnoringCase(attribute, folded);
+        else if (text::LowerAscii(attribute[i]) != folded[i])
+            return false;
+    return attribute.size() == folded.size();
+}
+
+/// `Count` for an attribute without a meaning.
+NodeProperty PropertyOf(std::string_view attribute) {
+    if (!text::IsAscii(attribute)) {
+        const auto folded = text::FoldCase(attribute);
+        return text::IsAscii(folded) ? PropertyOf(folded) : NodeProperty::Count;
+    }
+    if (attribute.size() > kLongestAttribute)
+        return NodeProperty::Count;
+    for (const auto row : kRowsByLength[attribute.size()])
+        if (row < std::size(kRows) && IsCalled(attribute, kRows[row].attribute))
+            return kRows[row].property;
+    return NodeProperty::Count;
 }
 
 std::size_t IndexOf(NodeProperty property) {
@@ -66,7 +94,6 @@ std::size_t IndexOf(NodeProperty property) {
 void NodeProperties::Attach(std::shared_ptr<XmlDocument> document, XmlNode element) {
     document_ = std::move(document);
     element_ = element;
-    positionsKnown_ = false;
 }
 
 void NodeProperties::Release() {
@@ -74,27 +101,50 @@ void NodeProperties::Release() {
     document_.reset();
     side_.clear();
     side_.shrink_to_fit();
-    positionsKnown_ = false;
 }
 
-std::string NodeProperties::Read(NodeProperty property) const {
-    FindAttributes();
-    const auto position = positions_[IndexOf(property)];
-    if (position >= 0)
-        return element_.attributeValue(static_cast<std::size_t>(position));
+std::string_view NodeProperties::Read(NodeProperty property) const {
+    const auto& row = kRows[IndexOf(property)];
+    for (auto attribute = element_.firstAttribute(); attribute; attribute = attribute.next())
+        if (IsCalled(attribute.name(), row.attribute))
+            return attribute.value();
     for (const auto& [kept, value] : side_)
         if (kept == property)
             return value;
-    return kRows[IndexOf(property)].absent;
+    return row.absent;
+}
+
+NodePropertyViews NodeProperties::ReadAll() const {
+    constexpr std::string_view kIndexes = "indexes";
+    NodePropertyViews views;
+    for (const auto& row : kRows)
+        views.values[IndexOf(row.property)] = row.absent;
+    for (const auto& [kept, value] : side_)
+        views.values[IndexOf(kept)] = value;
+    std::array<bool, static_cast<std::size_t>(NodeProperty::Count)> seen{};
+    bool indexesSeen = false;
+    for (auto attribute = element_.firstAttribute(); attribute; attribute = attribute.next()) {
+        const auto name = attribute.name();
+        const auto property = PropertyOf(name);
+        if (property != NodeProperty::Count) {
+            if (!std::exchange(seen[IndexOf(property)], true))
+                views.values[IndexOf(property)] = attribute.value();
+        } else if (name.size() >= kIndexes.size() && IsCalled(name.substr(0, kIndexes.size()), kIndexes)) {
+            if (name.size() > kIndexes.size())
+                views.hasMoreIndexes = true;
+            else if (!std::exchange(indexesSeen, true))
+                views.indexes = attribute.value();
+        }
+    }
+    return views;
 }
 
 void NodeProperties::Write(NodeProperty property, const std::string& value) {
-    FindAttributes();
-    const auto position = positions_[IndexOf(property)];
-    if (position >= 0) {
-        element_.setAttributeValue(static_cast<std::size_t>(position), value);
-        return;
-    }
+    for (auto attribute = element_.firstAttribute(); attribute; attribute = attribute.next())
+        if (IsCalled(attribute.name(), kRows[IndexOf(property)].attribute)) {
+            attribute.setValue(value);
+            return;
+        }
     const auto kept =
         std::find_if(side_.begin(), side_.end(), [&](const auto& entry) { return entry.first == property; });
     if (kept == side_.end())
@@ -103,27 +153,11 @@ void NodeProperties::Write(NodeProperty property, const std::string& value) {
         kept->second = value;
 }
 
-std::string NodeProperties::ReadAttribute(std::string_view name) const {
-    const auto count = element_ ? element_.attributeCount() : 0;
-    for (std::size_t i = 0; i < count; ++i)
-        if (text::EqualsIgnoringCase(element_.attributeName(i), name))
-            return element_.attributeValue(i);
+std::string_view NodeProperties::ReadAttribute(std::string_view name) const {
+    for (auto attribute = element_.firstAttribute(); attribute; attribute = attribute.next())
+        if (text::EqualsIgnoringCase(attribute.name(), name))
+            return attribute.value();
     return {};
-}
-
-void NodeProperties::FindAttributes() const {
-    if (positionsKnown_)
-        return;
-    positionsKnown_ = true;
-    positions_.fill(-1);
-    constexpr std::size_t kMostAttributes = 1000;
-    const auto count = element_ ? std::min(element_.attributeCount(), kMostAttributes) : 0;
-    for (std::size_t i = 0; i < count; ++i) {
-        const auto folded = text::FoldCase(element_.attributeName(i));
-        const auto known = PropertiesByAttribute().find(folded);
-        if (known != PropertiesByAttribute().end() && positions_[IndexOf(known->second)] < 0)
-            positions_[IndexOf(known->second)] = static_cast<std::int16_t>(i);
-    }
 }
 
 } // namespace tovimar

@@ -45,6 +45,19 @@ enum class NodeProperty : std::uint8_t {
     Count
 };
 
+/// The values of all properties of one node at one moment, for writers of many of them: the attributes are
+/// walked once. Views of the node's own texts, good until it changes.
+struct NodePropertyViews {
+    std::array<std::string_view, static_cast<std::size_t>(NodeProperty::Count)> values;
+    /// Of the attribute "Indexes"; with `hasMoreIndexes` there are numbered ones beside it.
+    std::string_view indexes;
+    bool hasMoreIndexes = false;
+
+    std::string_view operator[](NodeProperty property) const {
+        return values[static_cast<std::size_t>(property)];
+    }
+};
+
 /// The property values of one node. A node of a document keeps them in the attributes of its element, the
 /// document being shared by all its nodes; a node made in memory, and every property that the element has
 /// no attribute for, uses a side table. Attribute names compare without regard to case, the first of two
@@ -57,23 +70,18 @@ public:
     void Release();
     bool HasElement() const { return static_cast<bool>(element_); }
 
-    /// Empty, or the property's default ("-1" for the object type, "0" for numbers and flags).
-    std::string Read(NodeProperty property) const;
+    /// Empty, or the property's default ("-1" for the object type, "0" for numbers and flags). Good until the
+    /// next write.
+    std::string_view Read(NodeProperty property) const;
+    NodePropertyViews ReadAll() const;
     /// Into the element's attribute when it has one, else into the side table.
     void Write(NodeProperty property, const std::string& value);
     /// Any attribute of the element by name; empty when absent or without an element.
-    std::string ReadAttribute(std::string_view name) const;
+    std::string_view ReadAttribute(std::string_view name) const;
 
 private:
-    static constexpr std::size_t kCount = static_cast<std::size_t>(NodeProperty::Count);
-
-    void FindAttributes() const;
-
     std::shared_ptr<XmlDocument> document_;
     XmlNode element_;
-    /// Position of each property's attribute, -1 for none; found once, since attributes are never added.
-    mutable std::array<std::int16_t, kCount> positions_{};
-    mutable bool positionsKnown_ = false;
     std::vector<std::pair<NodeProperty, std::string>> side_;
 };
 

@@ -4,8 +4,12 @@
 #include "foundation/ErrorTrap.h"
 #include "platform/Environment.h"
 #include "platform/text/Text.h"
+#include "platform/xml/XmlCheck.h"
 #include "platform/xml/XmlDocument.h"
+#include "project/SitemapRepair.h"
 #include "project/SitemapText.h"
+
+#include <algorithm>
 
 namespace tovimar {
 
@@ -34,6 +38,30 @@ std::string WellFormedLine(std::string line) {
     return line;
 }
 
+std::string TextOfBytes(const std::string& bytes) {
+    const bool bigEndian = bytes.starts_with("\xFE\xFF");
+    if (!bigEndian && !bytes.starts_with("\xFF\xFE"))
+        return bytes.starts_with("\xEF\xBB\xBF") ? text::MakeValidUtf8(bytes.substr(3))
+                                                 : text::AnsiCodePage().Decode(bytes);
+    std::u16string units;
+    units.reserve(bytes.size() / 2);
+    for (std::size_t i = 2; i + 1 < bytes.size(); i += 2) {
+        const auto first = static_cast<unsigned char>(bytes[i]);
+        const auto second = static_cast<unsigned char>(bytes[i + 1]);
+        units += static_cast<char16_t>(bigEndian ? first << 8U | second : second << 8U | first);
+    }
+    return text::FromUtf16(units);
+}
+
+/// A header in the middle of a line without an end makes no document either.
+ResultCode LoadWellFormed(CXMLFile& file, const std::string& text, XmlDocument& document) {
+    try {
+        return file.LoadXml(text, document);
+    } catch (const RaisedError& error) {
+        return error.Number();
+    }
+}
+
 } // namespace
 
 std::string clsHHCLoader::WellFormed(const std::string& text) {
@@ -50,19 +78,57 @@ std::string clsHHCLoader::WellFormed(const std::string& text) {
 
 ResultCode clsHHCLoader::Load(const std::string& vstrHHCFileFullPath) {
     return Trapped(
-        "clsHHCLoader", "Load",
-        [&] {
-            root_.reset();
-            flat_.clear();
-            const auto bytes = platform::Env().files->ReadFile(vstrHHCFileFullPath);
-            XmlDocument document;
-            CXMLFile file;
-            errorCode_ = file.LoadXml(WellFormed(text::AnsiCodePage().Decode(bytes)), document);
-            errorReason_ = file.XmlParseError.reason;
-            if (errorCode_ == kSuccess)
-                Walk(0, document.documentElement().childElements());
-        },
+        "clsHHCLoader", "Load", [&] { ReadFile(vstrHHCFileFullPath); },
         [&] { return "HHCFileFullPath = " + vstrHHCFileFullPath; });
+}
+
+void clsHHCLoader::ReadFile(const std::string& path) {
+    auto& files = *platform::Env().files;
+    if (files.FileLength(path) > kMaxXmlBytes)
+        throw RaisedError(kFailure1, "'" + path + "' is longer than 64 MB", "clsHHCLoader.Load");
+    LoadBytes(files.ReadFile(path));
+}
+
+void clsHHCLoader::LoadBytes(const std::string& bytes) {
+    root_.reset();
+    flat_.clear();
+    dropped_ = 0;
+    ReadText(TextOfBytes(bytes));
+}
+
+/// As it stands first; what is no XML then is read tag by tag.
+void clsHHCLoader::ReadText(const std::string& text) {
+    XmlDocument document;
+    CXMLFile file;
+    errorLine_ = 0;
+    errorCode_ = LoadWellFormed(file, WellFormed(text), document);
+    errorReason_ = file.XmlParseError.reason;
+    if (errorCode_ != kSuccess) {
+        const auto repaired = RepairSitemap(text);
+        errorReason_ = repaired.reason;
+        errorLine_ = repaired.line;
+        if (!repaired.reason.empty())
+            return;
+        errorCode_ = file.LoadXml(repaired.text, document);
+        errorReason_ = file.XmlParseError.reason;
+    }
+    if (errorCode_ == kSuccess)
+        Walk(0, {document.documentElement()});
+}
+
+bool clsHHCLoader::Convert(const std::string& path, std::string& projectText, std::string& message) {
+    clsHHCLoader loader;
+    loader.ReadFile(path);
+    if (loader.Root() != nullptr) {
+        projectText = loader.GetXMLStr();
+        return true;
+    }
+    const auto reason = loader.ErrorReason().empty() ? std::string("There is no list of topics in the file")
+                                                     : loader.ErrorReason();
+    message = path +
+              (loader.ErrorLine() == 0 ? std::string() : ", line " + std::to_string(loader.ErrorLine())) +
+              ": " + reason;
+    return false;
 }
 
 /// The body's list is the first level, each list in it one deeper.
@@ -71,11 +137,13 @@ void clsHHCLoader::Walk(std::int32_t level, const std::vector<XmlNode>& nodes) {
         const auto tag = node.nodeName();
         if (text::EqualsIgnoringCase(tag, "UL")) {
             Walk(level + 1, node.childElements());
-        } else if (text::EqualsIgnoringCase(tag, "BODY") || text::EqualsIgnoringCase(tag, "LI")) {
+        } else if (text::EqualsIgnoringCase(tag, "HTML") || text::EqualsIgnoringCase(tag, "BODY") ||
+                   text::EqualsIgnoringCase(tag, "LI")) {
             Walk(level, node.childElements());
         } else if (text::EqualsIgnoringCase(tag, "OBJECT")) {
             auto entry = std::make_unique<clsHHCObjectEntry>();
-            entry->ProcessHHCXmlStrTree(level, node.childElements());
+            // An object outside of all lists stands where the first list's would.
+            entry->ProcessHHCXmlStrTree(std::max(level, 1), node.childElements());
             Place(std::move(entry));
         }
     }
@@ -91,8 +159,10 @@ void clsHHCLoader::Place(std::unique_ptr<clsHHCObjectEntry> entry) {
     // Entries that are not above anything that follows leave the chain: only ancestors are of use.
     while (flat_.size() > 1 && flat_.back()->Level >= placed->Level)
         flat_.pop_back();
-    if (flat_.back()->Level >= placed->Level)
+    if (flat_.back()->Level >= placed->Level) {
+        ++dropped_;
         return;
+    }
     flat_.back()->Children.push_back(std::move(entry));
     flat_.push_back(placed);
 }

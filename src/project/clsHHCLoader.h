@@ -3,6 +3,7 @@
 #include "platform/Error.h"
 #include "platform/KeyedList.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <string>
@@ -77,21 +78,36 @@ private:
     KeyedList<clsHHCObjectEntryComment> comments_;
 };
 
-/// Reads a contents file of another tool and gives it as project XML.
+/// Reads a contents file of another tool and gives it as project XML. The text is UTF-8 or UTF-16 with a byte
+/// order mark, else in the ANSI code page. Markup that is no XML is repaired where that can be done:
+/// unbalanced lists, tags of any case anywhere in a line, values in any quotes, bare "&".
+///
+/// The first entry becomes the project; a later one that stands beside it, not below it, has no place in a
+/// project and is counted as dropped.
 class clsHHCLoader {
 public:
     /// 0 also for a file that can't be read as entries; `ErrorCode` then tells.
     ResultCode Load(const std::string& vstrHHCFileFullPath);
+    /// The same for the bytes of a file.
+    void LoadBytes(const std::string& bytes);
     ResultCode SaveXml(const std::string& path) const;
     /// The header alone when nothing was loaded.
     std::string GetXMLStr() const;
+    /// A file's entries as project text. False with a message that names path and line when there is nothing
+    /// to be had; a file that can't be read raises its failure.
+    static bool Convert(const std::string& path, std::string& projectText, std::string& message);
 
     ResultCode ErrorCode() const { return errorCode_; }
     const std::string& ErrorReason() const { return errorReason_; }
+    /// From 1; 0 when no line is to blame.
+    std::int32_t ErrorLine() const { return errorLine_; }
+    std::size_t DroppedEntries() const { return dropped_; }
     const clsHHCObjectEntry* Root() const { return root_.get(); }
 
 private:
     static std::string WellFormed(const std::string& text);
+    void ReadFile(const std::string& path);
+    void ReadText(const std::string& text);
     void Walk(std::int32_t level, const std::vector<XmlNode>& nodes);
     void Place(std::unique_ptr<clsHHCObjectEntry> entry);
 
@@ -99,6 +115,8 @@ private:
     std::vector<clsHHCObjectEntry*> flat_;
     ResultCode errorCode_ = kSuccess;
     std::string errorReason_;
+    std::int32_t errorLine_ = 0;
+    std::size_t dropped_ = 0;
 };
 
 } // namespace tovimar

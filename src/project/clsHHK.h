@@ -5,6 +5,8 @@
 #include <map>
 #include <memory>
 #include <string>
+#include <string_view>
+#include <unordered_map>
 #include <vector>
 
 namespace tovimar {
@@ -30,11 +32,6 @@ private:
 /// A keyword group or a link in the index. Making one counts as an index entry of the run.
 class clsHHKObject {
 public:
-    struct DisplayOrder {
-        bool operator()(const std::string& left, const std::string& right) const;
-    };
-    using Children = std::map<std::string, std::unique_ptr<clsHHKObject>, DisplayOrder>;
-
     clsHHKObject();
 
     std::string Key;
@@ -54,7 +51,7 @@ public:
     std::string GenerateHHK(std::int32_t vlngLevel = 0) const;
     /// The same behind a text that is long already.
     void AppendHHK(std::string& out, std::int32_t level) const;
-    void Terminate() { children_.clear(); }
+    void Terminate();
     std::size_t Count() const { return children_.size(); }
 
 private:
@@ -62,7 +59,10 @@ private:
     void AppendGroup(std::string& out, std::int32_t level) const;
 
     std::string displayValue_;
-    Children children_;
+    /// By folded display name, which is the order of the file.
+    std::map<std::string, std::unique_ptr<clsHHKObject>> children_;
+    /// The same when they are many; the names stand in `children_`.
+    std::unordered_map<std::string_view, clsHHKObject*> byName_;
 };
 
 /// The keyword index of a help project: links under keywords, both sorted without regard to case.

@@ -42,10 +42,6 @@ std::string clsHHKObjectParameter::Value() const {
     return text::EqualsIgnoringCase(Name, "Local") ? platform::FileNameOf(value_) : value_;
 }
 
-bool clsHHKObject::DisplayOrder::operator()(const std::string& left, const std::string& right) const {
-    return text::CompareIgnoringCase(left, right) < 0;
-}
-
 clsHHKObject::clsHHKObject() {
     if (auto* data = Session::ServerData())
         ++data->GenerationStats().IndexEntriesQty;
@@ -67,15 +63,31 @@ std::string clsHHKObject::DisplayName(const std::string& parentKey) const {
 }
 
 clsHHKObject* clsHHKObject::GetObject(const std::string& vstrKey) const {
-    const auto found = children_.find(vstrKey);
+    const auto folded = text::FoldCase(vstrKey);
+    if (!byName_.empty()) {
+        const auto found = byName_.find(folded);
+        return found == byName_.end() ? nullptr : found->second;
+    }
+    const auto found = children_.find(folded);
     return found == children_.end() ? nullptr : found->second.get();
 }
 
 void clsHHKObject::Add(std::unique_ptr<clsHHKObject> robj) {
+    constexpr std::size_t kFew = 16;
     Trapped("clsHHKObject", "Add", [&] {
-        auto name = robj->DisplayName(Key);
-        children_.try_emplace(std::move(name), std::move(robj));
+        const auto [place, added] =
+            children_.try_emplace(text::FoldCase(robj->DisplayName(Key)), std::move(robj));
+        if (!byName_.empty() && added)
+            byName_.emplace(place->first, place->second.get());
+        else if (byName_.empty() && children_.size() > kFew)
+            for (const auto& [name, child] : children_)
+                byName_.emplace(name, child.get());
     });
+}
+
+void clsHHKObject::Terminate() {
+    byName_.clear();
+    children_.clear();
 }
 
 std::string clsHHKObject::GenerateHHK(std::int32_t vlngLevel) const {

@@ -1,6 +1,5 @@
 #include "topics/clsHTMLFile.h"
 
-#include "foundation/BackupFileName.h"
 #include "foundation/CUTF8FileReader.h"
 #include "foundation/CUTF8FileWriter.h"
 #include "foundation/CXmlMessages.h"
@@ -83,38 +82,22 @@ ResultCode clsHTMLFile::Save(const std::string& vstrFullPath) {
         fullPath_ = vstrFullPath;
     if (fullPath_.empty())
         return kFailure1;
-    platform::FileSystem& files = *platform::Env().files;
-    std::string backup;
-    ResultCode result = kSuccess;
-    const ResultCode failure = Trapped("clsHTMLFile", "Save", [&] {
-        if (files.FileExists(fullPath_)) {
-            backup = BackupFileName(fullPath_);
-            files.RenameFile(fullPath_, backup);
-        }
-        result = SetAttributes();
-        if (result == kSuccess)
-            result = CUTF8FileWriter().SaveFile(fullPath_, HTML, /*vfAddUTF8FileHeader=*/false,
-                                                /*vfSaveAsUsualTextFileIfNotUTF8=*/true);
-    });
-    const ResultCode restoring = Trapped("clsHTMLFile", "Save", [&] { Restore(backup); });
-    if (failure != kSuccess)
-        return failure;
-    return result != kSuccess ? result : restoring;
+    // The file system puts the finished page in the place of the old one: whoever ends the program at any
+    // moment finds one of the two whole, so that no copy beside it is needed.
+    const bool stood = platform::Env().files->FileExists(fullPath_);
+    ResultCode result = SetAttributes();
+    if (result == kSuccess)
+        result = CUTF8FileWriter().SaveFile(fullPath_, HTML, /*vfAddUTF8FileHeader=*/false,
+                                            /*vfSaveAsUsualTextFileIfNotUTF8=*/true);
+    if (result != kSuccess)
+        TellNotSaved(stood);
+    return result;
 }
 
-void clsHTMLFile::Restore(const std::string& backup) {
-    platform::FileSystem& files = *platform::Env().files;
-    const bool hasBackup = !backup.empty() && files.FileExists(backup);
-    if (files.FileExists(fullPath_)) {
-        if (hasBackup)
-            files.DeleteFile(backup);
-        return;
-    }
+void clsHTMLFile::TellNotSaved(bool originalStands) const {
     std::string message = "Can't save file '" + fullPath_ + "'.";
-    if (hasBackup) {
-        files.RenameFile(backup, fullPath_);
+    if (originalStands)
         message += "\r\nThe original file is restored.";
-    }
     ShowMessage(message, kMsgExclamation, "Tovimar Add-In");
 }
 

@@ -6,8 +6,9 @@
 
 namespace tovimar {
 
-/// A page that is read from a template or an earlier page, filled in and written with a safety copy for the
-/// moment of writing. Made for one page: loaded, given its properties, saved.
+/// A page that is read from a template or an earlier page, filled in and written. The old file stands until
+/// the new one is finished, also when the program is ended in between. Made for one page: loaded, given its
+/// properties, saved.
 class clsHTMLFile {
 public:
     std::string Title;       ///< text of the `title` element
@@ -26,14 +27,14 @@ public:
     /// Takes the text that stands, or will stand, at a path.
     ResultCode LoadText(const std::string& vstrFullPath, std::string text);
     /// Fills the page in and writes it; the path given or the last one. 0; 0x80040001 without a path; else
-    /// the number of a reported failure, with the old file back in its place.
+    /// the number of a reported failure, with the old file as it was and a message that says so.
     ResultCode Save(const std::string& vstrFullPath = {});
 
 private:
     ResultCode SetAttributes();
     void FillTags();
     void PutScreenshotsMessage();
-    void Restore(const std::string& backup);
+    void TellNotSaved(bool originalStands) const;
 
     std::string fullPath_;
 };

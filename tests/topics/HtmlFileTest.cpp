@@ -3,6 +3,8 @@
 #include "platform/Environment.h"
 #include "topics/TopicTest.h"
 
+#include <filesystem>
+
 namespace tovimar {
 namespace {
 
@@ -81,6 +83,16 @@ TEST_F(HtmlFileTest, TheOldFileComesBackWhenTheNewOneCantBeWritten) {
     ASSERT_FALSE(boxes->shown.empty());
     EXPECT_NE(std::string::npos, boxes->shown.back().text.find("Can't save file '"));
     EXPECT_EQ(std::string::npos, boxes->shown.back().text.find("restored"));
+
+    // A page that may not be written stays as it was.
+    const std::string native = environment->files->ToNative(path);
+    std::filesystem::permissions(native, std::filesystem::perms::owner_read);
+    EXPECT_NE(kSuccess, file.Save(path));
+    EXPECT_EQ("Can't save file '" + native + "'.\r\nThe original file is restored.",
+              boxes->shown.back().text);
+    EXPECT_EQ("old", ReadFile(path));
+    EXPECT_EQ((std::vector<std::string>{"p.htm", "p_20260102.htm"}),
+              environment->files->ListFiles(Folder(), "p*.htm"));
 }
 
 } // namespace

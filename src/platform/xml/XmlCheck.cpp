@@ -4,6 +4,9 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <array>
+#include <cstdint>
+#include <cstring>
 #include <vector>
 
 namespace tovimar {
@@ -14,13 +17,35 @@ bool IsSpace(char byte) {
 }
 
 /// Letters beyond ASCII all count as name characters; the bytes are known to be good UTF-8 by then.
-bool IsNameStart(char byte) {
+constexpr bool IsNameStart(char byte) {
     return (byte >= 'a' && byte <= 'z') || (byte >= 'A' && byte <= 'Z') || byte == '_' || byte == ':' ||
-           !text::IsAscii(byte);
+           static_cast<unsigned char>(byte) >= 0x80;
 }
 
-bool IsNamePart(char byte) {
+constexpr bool IsNamePart(char byte) {
     return IsNameStart(byte) || (byte >= '0' && byte <= '9') || byte == '-' || byte == '.';
+}
+
+constexpr auto kNamePart = [] {
+    std::array<bool, 256> table{};
+    for (std::size_t i = 0; i < table.size(); ++i)
+        table[i] = IsNamePart(static_cast<char>(i));
+    return table;
+}();
+
+/// Eight bytes that hold no end of a value and need no look of their own: no quote, "&" or "<", no control
+/// character and nothing beyond ASCII. Values and texts are long runs of such.
+bool IsPlainBlock(const char* bytes) {
+    constexpr std::uint64_t kOnes = 0x0101010101010101U;
+    constexpr std::uint64_t kTops = 0x8080808080808080U;
+    std::uint64_t block = 0;
+    std::memcpy(&block, bytes, sizeof block);
+    const auto hits = [&](char byte) {
+        const std::uint64_t changed = block ^ (kOnes * static_cast<unsigned char>(byte));
+        return (changed - kOnes) & ~changed;
+    };
+    const std::uint64_t below = (block - kOnes * 0x20U) & ~block;
+    return ((block | below | hits('"') | hits('\'') | hits('&') | hits('<')) & kTops) == 0;
 }
 
 bool IsPredefinedEntity(std::string_view name) {
@@ -53,7 +78,6 @@ public:
     explicit Checker(std::string_view text) : text_(text) {}
 
     void Run() {
-        CheckCharacters();
         if (StartsWith("<?xml") && position_ + 5 < text_.size() && IsSpace(text_[position_ + 5]))
             SkipPast("?>", "The XML declaration is not closed");
         while (position_ < text_.size())
@@ -69,22 +93,31 @@ private:
 
     bool StartsWith(std::string_view what) const { return text_.substr(position_).starts_with(what); }
 
-    void CheckCharacters() {
-        for (std::size_t i = 0; i < text_.size();) {
-            const char byte = text_[i];
-            position_ = i;
-            if (text::IsAscii(byte)) {
-                if (static_cast<unsigned char>(byte) < 0x20 && !IsSpace(byte))
-                    Fail("A control character stands in the text");
-                ++i;
-                continue;
-            }
-            bool wellFormed = true;
-            text::NextCodePoint(text_, i, &wellFormed);
-            if (!wellFormed)
-                Fail("An invalid character was found in text content");
+    /// The character at the position, which moves behind it.
+    void Character() {
+        const char byte = text_[position_];
+        if (text::IsAscii(byte)) {
+            if (static_cast<unsigned char>(byte) < 0x20 && !IsSpace(byte))
+                Fail("A control character stands in the text");
+            ++position_;
+            return;
         }
-        position_ = 0;
+        bool wellFormed = true;
+        std::size_t behind = position_;
+        text::NextCodePoint(text_, behind, &wellFormed);
+        if (!wellFormed)
+            Fail("An invalid character was found in text content");
+        position_ = behind;
+    }
+
+    void CharactersUntil(std::size_t end) {
+        while (position_ < end)
+            Character();
+    }
+
+    void SkipPlainBlocks() {
+        while (position_ + 8 <= text_.size() && IsPlainBlock(text_.data() + position_))
+            position_ += 8;
     }
 
     void Step() {
@@ -108,7 +141,7 @@ private:
         const auto end = text_.find(what, position_);
         if (end == std::string_view::npos)
             Fail(reason);
-        position_ = end + what.size();
+        CharactersUntil(end + what.size());
     }
 
     void SkipSpaces() {
@@ -118,6 +151,9 @@ private:
 
     void Text() {
         while (position_ < text_.size() && text_[position_] != '<') {
+            SkipSpaces();
+            if (position_ >= text_.size() || text_[position_] == '<')
+                break;
             const char byte = text_[position_];
             if (open_.empty() && !IsSpace(byte))
                 Fail(hadRoot_ ? "Only comments and white space may follow the root element"
@@ -127,7 +163,7 @@ private:
             else if (byte == ']' && StartsWith("]]>"))
                 Fail("']]>' may not stand in text");
             else
-                ++position_;
+                Character();
         }
     }
 
@@ -148,7 +184,7 @@ private:
         const auto end = text_.find("--", position_);
         if (end == std::string_view::npos)
             Fail("The comment is not closed");
-        position_ = end + 2;
+        CharactersUntil(end + 2);
         if (!StartsWith(">"))
             Fail("'--' may not stand in a comment");
         ++position_;
@@ -179,15 +215,15 @@ private:
             Fail("The document type is not closed");
         if (text_[end] == '[')
             Fail("Document types with declarations are not accepted");
-        position_ = end + 1;
+        CharactersUntil(end + 1);
     }
 
     std::string_view Name(const char* reason) {
         const std::size_t start = position_;
         if (position_ >= text_.size() || !IsNameStart(text_[position_]))
             Fail(reason);
-        while (position_ < text_.size() && IsNamePart(text_[position_]))
-            ++position_;
+        while (position_ < text_.size() && kNamePart[static_cast<unsigned char>(text_[position_])])
+            Character();
         return text_.substr(start, position_ - start);
     }
 
@@ -210,6 +246,7 @@ private:
 
     void Attributes() {
         names_.clear();
+        looks_ = 0;
         for (;;) {
             const std::size_t before = position_;
             SkipSpaces();
@@ -219,10 +256,28 @@ private:
                 break;
             if (position_ == before)
                 Fail("White space is missing");
-            names_.push_back(Name("An attribute has no name"));
+            AddName(Name("An attribute has no name"));
             AttributeValue();
         }
-        CheckUnique();
+        if (names_.size() > kFewNames)
+            CheckUnique();
+    }
+
+    /// Few names are compared as they come, and only with those that look alike.
+    void AddName(std::string_view name) {
+        const auto looks = (name.size() + 7U * static_cast<unsigned char>(name.front()) +
+                            13U * static_cast<unsigned char>(name.back())) %
+                           64;
+        const std::uint64_t mark = std::uint64_t{1} << looks;
+        if ((looks_ & mark) != 0 && names_.size() < kFewNames &&
+            std::find(names_.begin(), names_.end(), name) != names_.end())
+            FailTwice(name);
+        looks_ |= mark;
+        names_.push_back(name);
+    }
+
+    [[noreturn]] void FailTwice(std::string_view name) const {
+        Fail("Attribute '" + std::string(name) + "' stands twice in a tag");
     }
 
     void AttributeValue() {
@@ -234,13 +289,13 @@ private:
         if (position_ >= text_.size() || (text_[position_] != '"' && text_[position_] != '\''))
             Fail("A string literal was expected, but no opening quote was found");
         const char quote = text_[position_++];
-        while (position_ < text_.size() && text_[position_] != quote) {
+        for (SkipPlainBlocks(); position_ < text_.size() && text_[position_] != quote;) {
             if (text_[position_] == '<')
                 Fail("The character '<' cannot be used in an attribute value");
             if (text_[position_] == '&')
                 Reference();
             else
-                ++position_;
+                Character();
         }
         if (position_ >= text_.size())
             Fail("A string literal was not closed");
@@ -248,12 +303,10 @@ private:
     }
 
     void CheckUnique() {
-        if (names_.size() < 2)
-            return;
         std::sort(names_.begin(), names_.end());
         const auto twice = std::adjacent_find(names_.begin(), names_.end());
         if (twice != names_.end())
-            Fail("Attribute '" + std::string(*twice) + "' stands twice in a tag");
+            FailTwice(*twice);
     }
 
     void EndTag() {
@@ -276,7 +329,9 @@ private:
     std::string_view text_;
     std::size_t position_ = 0;
     std::vector<std::string_view> open_;
-    std::vector<std::string_view> names_;
+    static constexpr std::size_t kFewNames = 64;
+    std::vector<std::string_view> names_; ///< of the tag's attributes
+    std::uint64_t looks_ = 0;             ///< a bit for each look that one of the names has
     bool hadRoot_ = false;
     bool hadType_ = false;
 };

@@ -89,7 +89,8 @@ bool XmlDocument::load(const std::string& path) {
     std::string url = report_.url;
     bool parsed = false;
     try {
-        parsed = Parse(ToUtf8(files.ReadFile(path)));
+        buffer_ = std::make_unique<std::string>(ToUtf8(files.ReadFile(path)));
+        parsed = ParseBuffer();
     } catch (const RaisedError& error) {
         report_.errorCode = error.Number();
         report_.reason = error.what();
@@ -104,16 +105,19 @@ bool XmlDocument::loadXML(std::string_view text) {
     return Parse(text);
 }
 
-bool XmlDocument::Parse(std::string_view text) {
+bool XmlDocument::Check(std::string_view text) {
     report_ = {};
     document_->reset();
-    if (const auto fault = CheckXml(text)) {
-        report_.errorCode = kIllFormed;
-        report_.reason = fault->reason;
-        FillPlace(report_, text, fault->offset);
-        return false;
-    }
-    const auto result = document_->load_buffer(text.data(), text.size(), kParseOptions, pugi::encoding_utf8);
+    const auto fault = CheckXml(text);
+    if (!fault)
+        return true;
+    report_.errorCode = kIllFormed;
+    report_.reason = fault->reason;
+    FillPlace(report_, text, fault->offset);
+    return false;
+}
+
+bool XmlDocument::Take(const pugi::xml_parse_result& result, std::string_view text) {
     if (result.status == pugi::status_ok)
         return true;
     document_->reset();
@@ -121,6 +125,17 @@ bool XmlDocument::Parse(std::string_view text) {
     report_.reason = result.description();
     FillPlace(report_, text, static_cast<std::size_t>(std::max<std::ptrdiff_t>(0, result.offset)));
     return false;
+}
+
+bool XmlDocument::Parse(std::string_view text) {
+    return Check(text) &&
+           Take(document_->load_buffer(text.data(), text.size(), kParseOptions, pugi::encoding_utf8), text);
+}
+
+bool XmlDocument::ParseBuffer() {
+    return Check(*buffer_) && Take(document_->load_buffer_inplace(buffer_->data(), buffer_->size(),
+                                                                  kParseOptions, pugi::encoding_utf8),
+                                   *buffer_);
 }
 
 XmlNode XmlDocument::documentElement() const {

@@ -12,6 +12,8 @@
 namespace pugi {
 class xml_document;
 class xml_node;
+struct xml_attribute_struct;
+struct xml_parse_result;
 struct xml_node_struct;
 } // namespace pugi
 
@@ -32,6 +34,24 @@ struct XmlParseReport {
     std::string url;     ///< path of the file, native; empty for text
 };
 
+/// An attribute handle; an empty one has neither name nor value. The views are good until the attribute's
+/// value is set or the document goes.
+class XmlAttribute {
+public:
+    XmlAttribute() = default;
+    explicit operator bool() const { return attribute_ != nullptr; }
+    std::string_view name() const;
+    std::string_view value() const;
+    void setValue(std::string_view value);
+    /// The attribute behind it in the source; empty behind the last.
+    XmlAttribute next() const;
+
+private:
+    friend class XmlNode;
+    explicit XmlAttribute(pugi::xml_attribute_struct* attribute) : attribute_(attribute) {}
+    pugi::xml_attribute_struct* attribute_ = nullptr;
+};
+
 /// A node handle: cheap to copy, empty handles answer with nothing, valid while its document lives.
 class XmlNode {
 public:
@@ -42,16 +62,20 @@ public:
     bool IsComment() const;
     /// Tag name with its prefix; "#comment", "#text".
     std::string nodeName() const;
+    /// The tag name of an element as a view, good while the document lives.
+    std::string_view tagName() const;
     /// Tag name without its prefix.
     std::string baseName() const;
     XmlNode parent() const;
     XmlNode firstChild() const;
+    XmlNode nextSibling() const;
     std::vector<XmlNode> childNodes() const;
     std::vector<XmlNode> childElements() const;
 
     /// Exact comparison, as the model has it. None when absent.
     std::optional<std::string> getAttribute(std::string_view name) const;
     std::string attribute(std::string_view name, std::string_view absent = {}) const;
+    XmlAttribute firstAttribute() const;
     std::size_t attributeCount() const;
     /// 0-based, in the order of the source.
     std::string attributeName(std::size_t index) const;
@@ -110,6 +134,11 @@ public:
 
 private:
     bool Parse(std::string_view text);
+    /// Parses what the buffer holds, where it stands.
+    bool ParseBuffer();
+    bool Check(std::string_view text);
+    bool Take(const pugi::xml_parse_result& result, std::string_view text);
+    std::unique_ptr<std::string> buffer_; ///< of a file: its nodes' texts stand in it
     std::unique_ptr<pugi::xml_document> document_;
     XmlParseReport report_;
 };

@@ -55,6 +55,34 @@ pugi::xpath_query Compile(std::string_view xpath) {
 
 } // namespace
 
+std::string_view XmlAttribute::name() const {
+    return pugi::xml_attribute(attribute_).name();
+}
+
+std::string_view XmlAttribute::value() const {
+    return pugi::xml_attribute(attribute_).value();
+}
+
+void XmlAttribute::setValue(std::string_view value) {
+    pugi::xml_attribute(attribute_).set_value(std::string(value).c_str());
+}
+
+XmlAttribute XmlAttribute::next() const {
+    return XmlAttribute(pugi::xml_attribute(attribute_).next_attribute().internal_object());
+}
+
+std::string_view XmlNode::tagName() const {
+    return Wrap(node_).name();
+}
+
+XmlAttribute XmlNode::firstAttribute() const {
+    return XmlAttribute(Wrap(node_).first_attribute().internal_object());
+}
+
+XmlNode XmlNode::nextSibling() const {
+    return XmlNode(Wrap(node_).next_sibling().internal_object());
+}
+
 XmlAttributes::XmlAttributes(const XmlNode& node) {
     attributes_.reserve(24);
     for (auto attribute = Wrap(node.node_).first_attribute(); attribute;
