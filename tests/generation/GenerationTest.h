@@ -40,6 +40,12 @@ protected:
         Generator().HelpProjectTree();
     }
 
+    /// The installation's settings and messages; catalogue, project and folder stay those of the test.
+    void LoadSettings() {
+        server.ServerData()->LoadSettings();
+        Session::SetProjects(&projects);
+        Parameters().SetFolderForGeneratedHelp(project->Folder);
+    }
     CTovimar& Generator() { return server.ServerData()->Generator(); }
     CTovimarParameters& Parameters() { return Generator().Parameters(); }
     std::string HelpFile(const std::string& name) { return ReadFile(project->Folder + name); }
