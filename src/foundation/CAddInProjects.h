@@ -62,10 +62,10 @@ private:
     void ReadCatalogue();
     void ReadProject(const XmlNode& element);
     ResultCode SaveTree(const std::string& path);
-    void SaveCatalogue();
+    ResultCode SaveCatalogue();
     void TakeOverChanges();
     void NoteListed(const XmlNode& projects);
-    void WriteCatalogue(const std::string& text);
+    ResultCode WriteCatalogue(const std::string& text);
     void Remove(std::size_t position);
 
     List list_;

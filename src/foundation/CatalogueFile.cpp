@@ -146,16 +146,17 @@ ResultCode CAddInProjects::SaveCurrentProject(const std::string& vstrFullPath2Sa
 
 ResultCode CAddInProjects::Save(const std::string& vstrProjectTreeFullPathToSave) {
     ResultCode tree = kSuccess;
-    const ResultCode catalogue = Trapped(
+    ResultCode catalogue = kSuccess;
+    const ResultCode trapped = Trapped(
         kClass, "Save",
         [&] {
             Projects();
             if (!vstrProjectTreeFullPathToSave.empty())
                 tree = SaveTree(vstrProjectTreeFullPathToSave);
-            SaveCatalogue();
+            catalogue = SaveCatalogue();
         },
         [&] { return "File = " + path_; });
-    return tree != kSuccess ? tree : catalogue;
+    return tree != kSuccess ? tree : trapped != kSuccess ? trapped : catalogue;
 }
 
 ResultCode CAddInProjects::SaveTree(const std::string& path) {
@@ -167,11 +168,11 @@ ResultCode CAddInProjects::SaveTree(const std::string& path) {
                                        current_ != nullptr ? current_->PicsSubfolderName : std::string());
 }
 
-void CAddInProjects::SaveCatalogue() {
+ResultCode CAddInProjects::SaveCatalogue() {
     const auto lock = platform::Env().files->LockFolder(platform::FolderOf(path_));
     TakeOverChanges();
     std::string text = "<Projects>\r\n";
-    listed_.clear();
+    std::set<std::string> written;
     for (const auto& project : list_) {
         if (project->TvpFullPath().empty())
             continue;
@@ -179,9 +180,12 @@ void CAddInProjects::SaveCatalogue() {
             project->SetTitle(Session::Context().HelpProjectTitle());
         text += ProjectLine(*project);
         project->IsNew = false;
-        listed_.insert(KeyOf(*project));
+        written.insert(KeyOf(*project));
     }
-    WriteCatalogue(text + "</Projects>");
+    const ResultCode result = WriteCatalogue(text + "</Projects>");
+    if (result == kSuccess)
+        listed_ = std::move(written);
+    return result;
 }
 
 /// The file may have been written by another process since: what it listed comes in, what it forgot goes.
@@ -203,18 +207,20 @@ void CAddInProjects::TakeOverChanges() {
     }
 }
 
-void CAddInProjects::WriteCatalogue(const std::string& text) {
+ResultCode CAddInProjects::WriteCatalogue(const std::string& text) {
     auto& environment = platform::Env();
     auto& files = *environment.files;
     const bool hadFile = files.FileExists(path_);
     if (hadFile)
         files.CopyFile(path_, path_ + ".bak");
     CXMLFile file;
-    file.SaveXml(path_, text, Durability::OnDisk);
+    const ResultCode result = file.SaveXml(path_, text, Durability::OnDisk);
     environment.doEvents();
     XmlDocument document;
-    if (file.Load(path_, document) != 0 && hadFile)
+    const ResultCode unreadable = file.Load(path_, document);
+    if (unreadable != kSuccess && hadFile)
         files.CopyFile(path_ + ".bak", path_);
+    return result != kSuccess ? result : unreadable;
 }
 
 } // namespace tovimar

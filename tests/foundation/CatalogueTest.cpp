@@ -121,6 +121,59 @@ TEST_F(CatalogueTest, ABrokenProjectCostsItsEntryOnly) {
                                         "available projects.");
 }
 
+TEST_F(CatalogueTest, ProcessesKeepEachOthersEntries) {
+    projects.Init(Catalogue());
+    projects.Add(Make("Old"));
+    projects.Add(Make("Mine"));
+    projects.Save();
+    const auto forget = [&](const std::string& name) {
+        CAddInProjects other;
+        other.Init(Catalogue());
+        EXPECT_TRUE(other.Forget(Path("help " + name + "\\" + name + ".tvp")));
+        EXPECT_EQ(other.Save(), 0);
+    };
+    {
+        CAddInProjects other;
+        other.Init(Catalogue());
+        other.Add(Make("Theirs"));
+        projects.Add(Make("New"));
+        EXPECT_EQ(other.Save(), 0);
+    }
+    projects.SetCurrentProject(projects.Project(Path("Help Mine\\Mine.tvp")));
+    forget("Old");
+    forget("Mine");
+    EXPECT_EQ(projects.Save(), 0);
+
+    // The current project is in use here, whoever forgot it elsewhere.
+    CAddInProjects again;
+    again.Init(Catalogue());
+    EXPECT_EQ(again.Count(), 3);
+    for (const char* name : {"Mine", "Theirs", "New"})
+        EXPECT_NE(again.Project(Path(std::string("Help ") + name + "\\" + name + ".tvp")), nullptr) << name;
+    EXPECT_EQ(projects.Count(), 3);
+}
+
+TEST_F(CatalogueTest, IdentifiersThatWouldBreakTheFileAreMadeAnew) {
+    Make("One");
+    environment->files->MakeFolders(Path("app"));
+    environment->files->WriteFile(Catalogue(), "<Projects><Project Name='One' FileName='One' Folder='" +
+                                                   Path("Help One") +
+                                                   "' SUID='&quot;/>' HUID='{H}'/></Projects>");
+    projects.Init(Catalogue());
+    EXPECT_EQ(projects.Save(), 0);
+    EXPECT_NE(ReadFile(Catalogue()).find("SUID = \"{00000000-0000-0000-0000-000000000001}\" HUID = \"{H}\""),
+              std::string::npos);
+}
+
+TEST_F(CatalogueTest, TellsThatSavingFailed) {
+    projects.Init(Catalogue());
+    projects.SetCurrentProject(&projects.Add(Make("One")));
+    source.treeResult = 61;
+    EXPECT_EQ(projects.SaveCurrentProject(), 61);
+    EXPECT_EQ(CAddInProjects().Init(Catalogue()), 0);
+    EXPECT_NE(ReadFile(Catalogue()).find("Name = \"One\""), std::string::npos);
+}
+
 TEST_F(CatalogueTest, NamesAreUniqueAmongSavedProjects) {
     projects.Init(Catalogue());
     projects.Add(Make("Orders")).IsNew = false;

@@ -25,9 +25,9 @@ mode_t ModeForNewFiles() {
 
 NativeFile::NativeFile(const std::string& path, int flags)
     // Without O_NONBLOCK the opening of a pipe with nobody at its other end would never return.
-    : descriptor_(open(path.c_str(), flags | O_CLOEXEC | O_NONBLOCK, 0666)), path_(path) {
+    : descriptor_(open(path.c_str(), flags | O_CLOEXEC | O_NONBLOCK, 0666)), path_(path), told_(path) {
     if (descriptor_ < 0)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
 }
 
 NativeFile NativeFile::TemporaryBeside(const std::string& target) {
@@ -35,7 +35,7 @@ NativeFile NativeFile::TemporaryBeside(const std::string& target) {
     const int descriptor = mkostemp(pattern.data(), O_CLOEXEC);
     if (descriptor < 0)
         RaiseFileFailure(errno, target);
-    NativeFile file(descriptor, pattern);
+    NativeFile file(descriptor, pattern, target);
     struct stat info {};
     const bool stands = stat(target.c_str(), &info) == 0;
     // Before the mode: a change of the owner takes bits of it away.
@@ -51,19 +51,20 @@ NativeFile::~NativeFile() {
 }
 
 NativeFile::NativeFile(NativeFile&& other) noexcept
-    : descriptor_(std::exchange(other.descriptor_, -1)), path_(std::move(other.path_)) {}
+    : descriptor_(std::exchange(other.descriptor_, -1)), path_(std::move(other.path_)),
+      told_(std::move(other.told_)) {}
 
 struct stat NativeFile::Info() const {
     struct stat info {};
     if (fstat(descriptor_, &info) != 0)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
     return info;
 }
 
 std::string NativeFile::ReadAll() const {
     const auto info = Info();
     if (!S_ISREG(info.st_mode))
-        RaiseFileNumber(kPathAccessError, path_);
+        RaiseFileNumber(kPathAccessError, told_);
     return ReadHere(static_cast<std::size_t>(info.st_size));
 }
 
@@ -75,7 +76,7 @@ std::string NativeFile::ReadHere(std::size_t most) const {
         if (got < 0 && errno == EINTR)
             continue;
         if (got < 0)
-            RaiseFileFailure(errno, path_);
+            RaiseFileFailure(errno, told_);
         if (got == 0)
             break;
         done += static_cast<std::size_t>(got);
@@ -90,25 +91,25 @@ void NativeFile::WriteAll(std::string_view bytes) const {
         if (written < 0 && errno == EINTR)
             continue;
         if (written < 0)
-            RaiseFileFailure(errno, path_);
+            RaiseFileFailure(errno, told_);
         bytes.remove_prefix(static_cast<std::size_t>(written));
     }
 }
 
 void NativeFile::SeekTo(off_t offset) const {
     if (lseek(descriptor_, offset, SEEK_SET) < 0)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
 }
 
 void NativeFile::CutHere() const {
     const off_t end = lseek(descriptor_, 0, SEEK_CUR);
     if (end < 0 || ftruncate(descriptor_, end) != 0)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
 }
 
 void NativeFile::Sync() const {
     if (fsync(descriptor_) != 0 && errno != EINVAL && errno != ENOTSUP)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
 }
 
 bool NativeFile::TryLock() const {
@@ -117,7 +118,7 @@ bool NativeFile::TryLock() const {
 
 void NativeFile::Close() {
     if (close(std::exchange(descriptor_, -1)) != 0)
-        RaiseFileFailure(errno, path_);
+        RaiseFileFailure(errno, told_);
 }
 
 } // namespace tovimar::platform

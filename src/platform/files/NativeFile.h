@@ -34,10 +34,12 @@ public:
     void Close();
 
 private:
-    NativeFile(int descriptor, std::string path) : descriptor_(descriptor), path_(std::move(path)) {}
+    NativeFile(int descriptor, std::string path, std::string told)
+        : descriptor_(descriptor), path_(std::move(path)), told_(std::move(told)) {}
 
     int descriptor_ = -1;
     std::string path_;
+    std::string told_; ///< what failures name: of a temporary file the one that it is for
 };
 
 } // namespace tovimar::platform
