@@ -1,6 +1,7 @@
 #include "GenerationTest.h"
 
 #include "foundation/CTraceLog.h"
+#include "generation/CTovimarActions.h"
 #include "generation/CTovimarCompiler.h"
 #include "generation/OpenHelp.h"
 #include "generation/clsHtmlHelp.h"
@@ -190,6 +191,46 @@ TEST_F(RecompileTest, OpeningHelp) {
     projects.SetCurrentProject(nullptr);
     OpenHelp(true);
     EXPECT_EQ("HTML Help project was not yet generated and/or compiled.", LastBox());
+}
+
+TEST_F(RecompileTest, OpeningPartsOfTheProject) {
+    const std::string file = project->HHPFullPath();
+    const std::string index = project->HHKFullPath();
+    server.OpenHelpProject();
+    EXPECT_EQ("HTML help project doesn't exist '" + Native(file) + "'.", LastBox());
+    server.OpenHelpProjectIndex();
+    EXPECT_EQ("HTML help project index doesn't exist '" + Native(index) + "'.", LastBox());
+    WriteFile("help\\Shop.hhp", "");
+    WriteFile("help\\Shop.hhk", "");
+    server.OpenHelpProject();
+    server.OpenHelpProjectIndex();
+    server.OpenHelpFolder();
+    EXPECT_EQ((std::vector<std::string>{file, index, project->Folder}), processes->opened);
+
+    project->Folder = Path("gone\\");
+    server.OpenHelpFolder();
+    EXPECT_EQ("HTML help project folder doesn't exist '" + Native(Path("gone\\")) + "'.", LastBox());
+    projects.SetCurrentProject(nullptr);
+    server.OpenHelpProject();
+    EXPECT_EQ("HTML help project was not generated.", LastBox());
+    server.OpenHelpFolder();
+    EXPECT_EQ("HTML help project folder is empty.", LastBox());
+
+    answers["HostAppMainWindowHWnd"] = "77";
+    const std::string own = Path("vasmora.chm");
+    server.OpenHelpTopics();
+    EXPECT_EQ("Help doesn't exist '" + Native(own) + "'.", LastBox());
+    WriteFile("vasmora.chm", "");
+    server.OpenHelpTopics();
+    server.OpenHelpIndex();
+    server.OpenHelpSearch();
+    EXPECT_EQ((std::vector<std::string>{"1 " + own + " ", "top 1", "2 " + own + " ", "top 2",
+                                        "3 " + own + " ", "top 3"}),
+              viewer->calls);
+    std::int32_t owner = 0;
+    server.Actions().ShowAboutForm = [&](std::int32_t window) { owner = window; };
+    server.OpenAboutForm();
+    EXPECT_EQ(77, owner);
 }
 
 TEST_F(RecompileTest, HelpWindowsOfCallers) {
