@@ -24,6 +24,8 @@ void AddWebHelpScript(std::string& text) {
 
 void AddWebHelpScriptToFile(const std::string& path) {
     auto& files = *platform::Env().files;
+    if (!files.FileExists(path))
+        return;
     auto page = files.ReadFile(path);
     const auto length = page.size();
     AddWebHelpScript(page);

@@ -43,13 +43,17 @@ void clsHHK::AddCustomLink(const std::string& vstrIndexCaption, const std::strin
         if (!groupExisted) {
             auto made = std::make_unique<clsHHKObject>();
             made->Key = vstrIndexKey;
-            made->Parameters = {{"name", vstrIndexKey}, {"Local", local}};
+            made->Parameters.reserve(2);
+            made->Parameters.emplace_back("name", vstrIndexKey);
+            made->Parameters.emplace_back("Local", local);
             group = made.get();
             root_->Add(std::move(made));
         }
         auto link = std::make_unique<clsHHKObject>();
         link->Key = vstrIndexKey;
-        link->Parameters = {{"Name", vstrIndexCaption}, {"Local", local}};
+        link->Parameters.reserve(2);
+        link->Parameters.emplace_back("Name", vstrIndexCaption);
+        link->Parameters.emplace_back("Local", std::move(local));
         if (groupExisted) {
             link->SetIndexGroupDisplayValue(vstrIndexCaption);
             link->Key = link->Parameters[1].Value();

@@ -61,8 +61,8 @@ private:
     std::string displayValue_;
     /// By folded display name, which is the order of the file.
     std::map<std::string, std::unique_ptr<clsHHKObject>> children_;
-    /// The same when they are many; the names stand in `children_`.
-    std::unordered_map<std::string_view, clsHHKObject*> byName_;
+    /// The same when they are many, else null; the names stand in `children_`.
+    std::unique_ptr<std::unordered_map<std::string_view, clsHHKObject*>> byName_;
 };
 
 /// The keyword index of a help project: links under keywords, both sorted without regard to case.

@@ -64,9 +64,9 @@ std::string clsHHKObject::DisplayName(const std::string& parentKey) const {
 
 clsHHKObject* clsHHKObject::GetObject(const std::string& vstrKey) const {
     const auto folded = text::FoldCase(vstrKey);
-    if (!byName_.empty()) {
-        const auto found = byName_.find(folded);
-        return found == byName_.end() ? nullptr : found->second;
+    if (byName_ != nullptr) {
+        const auto found = byName_->find(folded);
+        return found == byName_->end() ? nullptr : found->second;
     }
     const auto found = children_.find(folded);
     return found == children_.end() ? nullptr : found->second.get();
@@ -77,16 +77,18 @@ void clsHHKObject::Add(std::unique_ptr<clsHHKObject> robj) {
     Trapped("clsHHKObject", "Add", [&] {
         const auto [place, added] =
             children_.try_emplace(text::FoldCase(robj->DisplayName(Key)), std::move(robj));
-        if (!byName_.empty() && added)
-            byName_.emplace(place->first, place->second.get());
-        else if (byName_.empty() && children_.size() > kFew)
+        if (byName_ != nullptr && added) {
+            byName_->emplace(place->first, place->second.get());
+        } else if (byName_ == nullptr && children_.size() > kFew) {
+            byName_ = std::make_unique<std::unordered_map<std::string_view, clsHHKObject*>>();
             for (const auto& [name, child] : children_)
-                byName_.emplace(name, child.get());
+                byName_->emplace(name, child.get());
+        }
     });
 }
 
 void clsHHKObject::Terminate() {
-    byName_.clear();
+    byName_.reset();
     children_.clear();
 }
 

@@ -1,182 +1,212 @@
 #include "TopicText.h"
 
+#include "PageCharset.h"
 #include "platform/text/Text.h"
-
-#include <unicode/uchar.h>
 
 #include <algorithm>
 #include <cctype>
-#include <cstdint>
-#include <utility>
 
 namespace tovimar::search {
 
 namespace {
 
-constexpr std::size_t kHeadBytes = 2048; ///< a page tells its charset in its head
 constexpr std::size_t kLongestReference = 10;
+constexpr auto kNone = std::string_view::npos;
 
-char LowerAscii(char c) {
-    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
+/// Text that gets a blank where a block or a run of blanks parts it.
+class Words {
+public:
+    void Add(std::string_view piece) { text_ += piece; }
+    void Part() {
+        if (!text_.empty() && text_.back() != ' ')
+            text_ += ' ';
+    }
+    std::string Take() {
+        auto whole = text::Trim(text_);
+        text_.clear();
+        return whole;
+    }
 
-/// ASCII only, on bytes: tags and attributes are.
-std::size_t FindTag(std::string_view page, std::string_view tag, std::size_t from) {
-    const auto found =
-        std::search(page.begin() + static_cast<std::ptrdiff_t>(std::min(from, page.size())), page.end(),
-                    tag.begin(), tag.end(), [](char left, char right) { return LowerAscii(left) == right; });
-    return found == page.end() ? std::string_view::npos : static_cast<std::size_t>(found - page.begin());
-}
-
-std::string CharsetOf(std::string_view bytes) {
-    const auto head = bytes.substr(0, kHeadBytes);
-    auto start = FindTag(head, "charset=", 0);
-    if (start == std::string_view::npos)
-        return {};
-    start += 8;
-    while (start < head.size() && (head[start] == '"' || head[start] == '\''))
-        ++start;
-    auto end = start;
-    while (end < head.size() &&
-           (std::isalnum(static_cast<unsigned char>(head[end])) != 0 || head[end] == '-'))
-        ++end;
-    return std::string(head.substr(start, end - start));
-}
-
-std::string Decode(std::string_view bytes) {
-    if (bytes.substr(0, 3) == "\xEF\xBB\xBF")
-        return text::MakeValidUtf8(bytes.substr(3));
-    const auto page = text::CodePageByCharsetName(CharsetOf(bytes));
-    if (page == 65001)
-        return text::MakeValidUtf8(bytes);
-    return text::CodePage(page == 0 ? 1252 : page).Decode(bytes);
-}
-
-const std::pair<const char*, const char*> kReferences[] = {
-    {"amp", "&"},  {"lt", "<"},  {"gt", ">"},    {"quot", "\""}, {"nbsp", " "},
-    {"copy", "©"}, {"reg", "®"}, {"mdash", "—"}, {"ndash", "–"}, {"apos", "'"},
+private:
+    std::string text_;
 };
 
-/// The character of a reference such as "amp" or "#1041"; empty for one that isn't known.
-std::string CharacterOf(std::string_view name) {
-    if (name.size() > 1 && name[0] == '#') {
-        const bool hex = name[1] == 'x' || name[1] == 'X';
-        std::uint32_t code = 0;
-        for (const char c : name.substr(hex ? 2 : 1)) {
-            const int digit = u_digit(static_cast<unsigned char>(c), hex ? 16 : 10);
-            if (digit < 0 || code > 0x110000U)
-                return {};
-            code = code * (hex ? 16U : 10U) + static_cast<std::uint32_t>(digit);
-        }
-        return code < 32 || code > 0x10FFFFU ? " " : text::FromCodePoint(static_cast<char32_t>(code));
+std::string Plain(std::string_view value) {
+    std::string out;
+    for (std::size_t at = 0; at < value.size(); ++at) {
+        const auto end = value[at] == '&' ? value.substr(at, kLongestReference).find(';') : kNone;
+        const auto character = end == kNone ? std::string() : CharacterOf(value.substr(at + 1, end - 1));
+        out += character.empty() ? std::string(1, value[at]) : character;
+        if (!character.empty())
+            at += end;
     }
-    for (const auto& [known, character] : kReferences)
-        if (name == known)
-            return character;
+    return out;
+}
+
+bool HasControlCharacters(std::string_view value) {
+    return std::any_of(value.begin(), value.end(), [](char c) { return static_cast<unsigned char>(c) < 32; });
+}
+
+bool IsBlank(char c) {
+    return static_cast<unsigned char>(c) <= ' ';
+}
+
+/// Value of an attribute in the tag's text behind its name; the name in lower case.
+std::string Attribute(std::string_view tag, std::string_view name) {
+    for (auto at = FindAscii(tag, name, 0); at != kNone; at = FindAscii(tag, name, at + 1)) {
+        auto value = at + name.size();
+        if (at == 0 || !IsBlank(tag[at - 1]) || value >= tag.size() || tag[value] != '=')
+            continue;
+        ++value;
+        const char quote = value < tag.size() ? tag[value] : ' ';
+        const bool quoted = quote == '"' || quote == '\'';
+        const auto start = quoted ? value + 1 : value;
+        const auto end = quoted ? tag.find(quote, start) : std::min(tag.find_first_of(" \t\r\n", start), tag.size());
+        return end == kNone ? std::string() : Plain(tag.substr(start, end - start));
+    }
     return {};
 }
 
-/// Appends what stands for the "&" at `at`, gives the position behind it.
-std::size_t AppendReference(std::string_view page, std::size_t at, std::string& out) {
-    const auto end = page.substr(at, kLongestReference).find(';');
-    const auto character =
-        end == std::string_view::npos ? std::string() : CharacterOf(page.substr(at + 1, end - 1));
-    out += character.empty() ? "&" : character;
-    return character.empty() ? at + 1 : at + end + 1;
-}
+/// One pass over the page.
+class Reader {
+public:
+    explicit Reader(std::string_view page) : page_(page) {}
 
-std::size_t Behind(std::string_view page, std::string_view tag, std::size_t from) {
-    const auto found = FindTag(page, tag, from);
-    return found == std::string_view::npos ? page.size() : found + tag.size();
-}
-
-/// Position behind the tag at `at`, or behind the whole element of a script, a style or a title.
-std::size_t SkipTag(std::string_view page, std::size_t at) {
-    const auto here = [&](std::string_view tag) { return FindTag(page.substr(at, tag.size()), tag, 0) == 0; };
-    if (here("<!--"))
-        return Behind(page, "-->", at);
-    if (here("<script"))
-        return Behind(page, "</script>", at);
-    if (here("<style"))
-        return Behind(page, "</style>", at);
-    if (here("<title"))
-        return Behind(page, "</title>", at);
-    return Behind(page, ">", at);
-}
-
-std::string VisibleText(std::string_view page) {
-    std::string out;
-    const auto blank = [&] {
-        if (!out.empty() && out.back() != ' ')
-            out += ' ';
-    };
-    for (std::size_t at = 0; at < page.size();) {
-        const char c = page[at];
-        if (c == '<') {
-            at = SkipTag(page, at);
-            blank();
-        } else if (c == '&') {
-            at = AppendReference(page, at, out);
-        } else if (static_cast<unsigned char>(c) <= ' ') {
-            ++at;
-            blank();
-        } else {
-            out += c;
-            ++at;
-        }
+    TopicText Read() {
+        while (at_ < page_.size())
+            if (page_[at_] == '<')
+                ReadTag();
+            else
+                ReadCharacter();
+        FinishHeading();
+        topic_.body = body_.Take();
+        topic_.title = text::Left(topic_.title, kLongestCaption);
+        return std::move(topic_);
     }
-    return text::Trim(out);
-}
 
-/// Visible text between the first open tag of this name and its end.
-std::string ElementText(std::string_view page, std::string_view open, std::string_view close) {
-    const auto start = FindTag(page, open, 0);
-    if (start == std::string_view::npos)
-        return {};
-    const auto from = Behind(page, ">", start);
-    const auto end = FindTag(page, close, from);
-    return end == std::string_view::npos ? std::string() : VisibleText(page.substr(from, end - from));
-}
+private:
+    void Add(std::string_view piece) {
+        body_.Add(piece);
+        if (heading_ != 0)
+            caption_.Add(piece);
+        else
+            anchor_.clear();
+    }
+    void Part() {
+        body_.Part();
+        caption_.Part();
+    }
 
-bool IsIdeograph(char32_t c) {
-    return (c >= 0x3040 && c <= 0x30FF) || (c >= 0x3400 && c <= 0x9FFF) || (c >= 0xF900 && c <= 0xFAFF);
-}
+    void ReadCharacter() {
+        const auto start = at_++;
+        const char c = page_[start];
+        if (IsBlank(c) || c == '\x7f')
+            return Part();
+        if (c == '&') {
+            const auto end = page_.substr(start, kLongestReference).find(';');
+            const auto character =
+                end == kNone ? std::string() : CharacterOf(page_.substr(start + 1, end - 1));
+            if (character == " ")
+                Part();
+            else
+                Add(character.empty() ? "&" : std::string_view(character));
+            if (!character.empty())
+                at_ = start + end + 1;
+            return;
+        }
+        while (at_ < page_.size() && page_[at_] != '<' && page_[at_] != '&' && !IsBlank(page_[at_]))
+            ++at_;
+        Add(page_.substr(start, at_ - start));
+    }
 
-bool IsWordCharacter(char32_t c) {
-    const auto kinds = static_cast<std::uint32_t>(U_GET_GC_MASK(static_cast<UChar32>(c)));
-    return (kinds & (U_GC_L_MASK | U_GC_N_MASK | U_GC_M_MASK)) != 0;
-}
+    std::size_t Behind(std::string_view text) const {
+        const auto found = FindAscii(page_, text, at_);
+        return found == kNone ? page_.size() : found + text.size();
+    }
+
+    void ReadTag() {
+        if (page_.substr(at_, 4) == "<!--") {
+            at_ = Behind("-->");
+            return Part();
+        }
+        const auto end = std::min(page_.find('>', at_), page_.size());
+        const auto tag = page_.substr(at_ + 1, end - at_ - 1);
+        std::string name;
+        for (const char c : tag.substr(0, 12)) {
+            if (IsBlank(c) || (c == '/' && !name.empty()))
+                break;
+            name += static_cast<char>(std::tolower(static_cast<unsigned char>(c)));
+        }
+        at_ = std::min(end + 1, page_.size());
+        if (name == "script" || name == "style")
+            at_ = Behind("</" + name + ">");
+        else if (name == "title")
+            ReadTitle();
+        else
+            NoteTag(name, tag);
+        // Bold letters inside a word don't part it.
+        if (name != "b" && name != "/b" && name != "i" && name != "/i" && name != "em" && name != "/em" &&
+            name != "u" && name != "/u")
+            Part();
+    }
+
+    void ReadTitle() {
+        const auto start = at_;
+        at_ = Behind("</title>");
+        const auto length = at_ - start;
+        // One that is never closed swallows the page, as in a browser.
+        if (length < 8 || page_.substr(at_ - 1, 1) != ">" || !topic_.title.empty())
+            return;
+        Reader title(page_.substr(start, length - 8));
+        title.inTitle_ = true;
+        topic_.title = title.Read().body;
+    }
+
+    void NoteTag(std::string_view name, std::string_view tag) {
+        const bool opens = name.size() == 2 && name[0] == 'h' && name[1] >= '1' && name[1] <= '6';
+        const bool closes = name.size() == 3 && name[0] == '/' && name[1] == 'h' && name[2] >= '1';
+        if (inTitle_)
+            return;
+        if (opens || closes)
+            FinishHeading();
+        if (opens)
+            heading_ = name[1] - '0';
+        if (!opens && name != "a")
+            return;
+        for (const char* attribute : {"name", "id"})
+            if (auto anchor = Attribute(tag, attribute); !anchor.empty())
+                anchor_ = std::move(anchor);
+    }
+
+    void FinishHeading() {
+        auto caption = caption_.Take();
+        const int level = heading_;
+        heading_ = 0;
+        if (level == 0)
+            return;
+        if (level == 1 && topic_.title.empty())
+            topic_.title = caption;
+        if (level > 1 && !caption.empty())
+            topic_.sections.push_back(
+                {HasControlCharacters(anchor_) ? "" : anchor_, text::Left(caption, kLongestCaption)});
+        anchor_.clear();
+    }
+
+    std::string_view page_;
+    std::size_t at_ = 0;
+    bool inTitle_ = false;
+    int heading_ = 0; ///< level of the open heading
+    std::string anchor_;
+    Words body_;
+    Words caption_;
+    TopicText topic_;
+};
 
 } // namespace
 
 TopicText ReadTopic(std::string_view bytes) {
-    const auto page = Decode(bytes);
-    TopicText topic;
-    topic.title = ElementText(page, "<title", "</title>");
-    if (topic.title.empty())
-        topic.title = ElementText(page, "<h1", "</h1>");
-    topic.body = VisibleText(page);
-    return topic;
-}
-
-std::vector<std::string> WordsOf(std::string_view text) {
-    std::vector<std::string> words;
-    std::u32string word;
-    const auto finish = [&] {
-        if (!word.empty())
-            words.push_back(text::FromCodePoints(word));
-        word.clear();
-    };
-    for (const auto c : text::ToCodePoints(text::ToLower(text))) {
-        if (IsIdeograph(c) || !IsWordCharacter(c))
-            finish();
-        if (IsWordCharacter(c))
-            word += c;
-        if (IsIdeograph(c))
-            finish();
-    }
-    finish();
-    return words;
+    const auto page = DecodePage(bytes);
+    return Reader(page).Read();
 }
 
 } // namespace tovimar::search

@@ -3,12 +3,16 @@
 #include "platform/text/Text.h"
 
 #include <algorithm>
+#include <cerrno>
+#include <cstdint>
 #include <filesystem>
 #include <fstream>
 #include <iostream>
 #include <iterator>
+#include <stdexcept>
 #include <string>
 #include <string_view>
+#include <system_error>
 #include <vector>
 
 namespace fs = std::filesystem;
@@ -21,6 +25,8 @@ const char* const kUsage =
     "Writes ss.html into the folder: a search page over its files with the extension (htm).\n"
     "  -iFILE   leaves a file out; may stand several times\n"
     "  -s -w -p -m -u -n with a number, and -x, are accepted and mean nothing here.\n";
+
+constexpr std::uintmax_t kLargestTopic = 64U << 20U;
 
 struct Options {
     fs::path folder;
@@ -86,23 +92,50 @@ std::vector<std::string> TopicNames(const Options& options) {
     return names;
 }
 
+std::runtime_error Failure(const fs::path& path, const std::string& what, int reason) {
+    return std::runtime_error("'" + path.string() + "' " + what +
+                              (reason == 0 ? "" : ": " + std::generic_category().message(reason)));
+}
+
 std::string ReadFile(const fs::path& path) {
+    errno = 0;
     std::ifstream in(path, std::ios::binary);
     if (!in)
-        throw fs::filesystem_error("Can't read", path, std::make_error_code(std::errc::io_error));
-    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+        throw Failure(path, "can't be read", errno);
+    if (fs::file_size(path) > kLargestTopic)
+        throw Failure(path, "is too large for a topic: more than 64 MB", 0);
+    std::string bytes(std::istreambuf_iterator<char>(in), {});
+    if (in.bad())
+        throw Failure(path, "can't be read", errno);
+    return bytes;
 }
 
 /// The page appears as a whole or not at all.
 void WritePage(const fs::path& path, const std::string& page) {
     auto temporary = path;
     temporary += ".tmp";
+    errno = 0;
     std::ofstream out(temporary, std::ios::binary | std::ios::trunc);
     out << page;
     out.close();
     if (!out)
-        throw fs::filesystem_error("Can't write", temporary, std::make_error_code(std::errc::io_error));
-    fs::rename(temporary, path);
+        throw Failure(temporary, "can't be written", errno);
+    std::error_code failed;
+    fs::rename(temporary, path, failed);
+    if (!failed)
+        return;
+    std::error_code ignored;
+    fs::remove(temporary, ignored);
+    throw Failure(path, "can't be replaced", failed.value());
+}
+
+void Run(const Options& options) {
+    if (!fs::is_directory(options.folder))
+        throw Failure(options.folder, "is no folder", 0);
+    search::SearchIndex index;
+    for (const auto& name : TopicNames(options))
+        index.AddPage(text::MakeValidUtf8(name), search::ReadTopic(ReadFile(options.folder / name)));
+    WritePage(options.folder / "ss.html", search::SearchPageText(index));
 }
 
 } // namespace
@@ -119,10 +152,7 @@ int main(int argc, char** argv) {
         return 2;
     }
     try {
-        search::SearchIndex index;
-        for (const auto& name : TopicNames(options))
-            index.AddPage(name, search::ReadTopic(ReadFile(options.folder / name)));
-        WritePage(options.folder / "ss.html", search::SearchPageText(index));
+        Run(options);
     } catch (const std::exception& failure) {
         std::cerr << "ss.exe: " << failure.what() << '\n';
         return 1;
