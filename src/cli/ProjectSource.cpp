@@ -13,6 +13,15 @@
 
 namespace tovimar::cli {
 
+namespace {
+
+[[noreturn]] void RefuseMissing(const std::string& source) {
+    throw Stop{"the application of the project isn't at '" + source +
+               "' any more\n--source names its place."};
+}
+
+} // namespace
+
 /// The catalogue knows what each project was made from.
 std::string RememberedSource(const std::string& projectFile) {
     CAddInProjects catalogue;
@@ -21,19 +30,20 @@ std::string RememberedSource(const std::string& projectFile) {
     if (project == nullptr || project->SourceProjectFullPath.empty())
         throw Stop{"it isn't known which application '" + projectFile +
                    "' was made from\n--source names its exports or its database."};
-    return project->SourceProjectFullPath;
+    const std::string& source = project->SourceProjectFullPath;
+    auto& files = *platform::Env().files;
+    if (!files.FileExists(source) && !files.FolderExists(platform::FolderOf(source)))
+        RefuseMissing(source);
+    return source;
 }
 
 /// A folder of exports counts as a database of its name, which needn't be there; with one at hand the exports
 /// beside it still belong to it.
 HostObject OpenRemembered(const std::string& source) {
     auto& files = *platform::Env().files;
-    const std::string folder = platform::FolderOf(source);
-    if (!files.FileExists(source) && !files.FolderExists(folder))
-        throw Stop{"the application of the project isn't at '" + source +
-                   "' any more\n--source names its place."};
     try {
-        auto application = platform::access::OpenAccessApplication(files.ToNative(folder));
+        auto application =
+            platform::access::OpenAccessApplication(files.ToNative(platform::FolderOf(source)));
         const std::string name = application->Get("CurrentProject").AsObject()->Get("FullName").AsString();
         if (text::EqualsIgnoringCase(name, source))
             return application;
@@ -42,8 +52,7 @@ HostObject OpenRemembered(const std::string& source) {
             throw;
     }
     if (!files.FileExists(source))
-        throw Stop{"the application of the project isn't at '" + source +
-                   "' any more\n--source names its place."};
+        RefuseMissing(source);
     return platform::access::OpenAccessApplication(files.ToNative(source));
 }
 

@@ -11,7 +11,7 @@ struct Arguments;
 class Surroundings;
 
 /// Windows path of the application that the catalogue remembers for a project. Raises `Stop` when it doesn't
-/// know it.
+/// know it, or nothing is there any more.
 std::string RememberedSource(const std::string& projectFile);
 /// Raises `Stop` when it isn't there any more.
 HostObject OpenRemembered(const std::string& source);

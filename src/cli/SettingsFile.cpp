@@ -48,7 +48,7 @@ Place FindElement(const std::string& text, const std::string& name) {
     return {};
 }
 
-/// With line ends as the line before has them.
+/// Before the end of the list, in a line that ends as that one does.
 std::string WithAdded(std::string text, const std::string& element) {
     auto at = text.find(kEnd);
     if (at == std::string::npos)
@@ -56,7 +56,9 @@ std::string WithAdded(std::string text, const std::string& element) {
     const auto line = text.rfind('\n', at);
     if (line != std::string::npos && text.find_first_not_of(" \t", line + 1) == at)
         at = line + 1;
-    return text.insert(at, "    " + element + "\r\n");
+    const auto end = text.find('\n', at);
+    const bool unixLines = end != std::string::npos && text[end - 1] != '\r';
+    return text.insert(at, "    " + element + (unixLines ? "\n" : "\r\n"));
 }
 
 } // namespace

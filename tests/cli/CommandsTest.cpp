@@ -24,12 +24,20 @@ TEST_F(CommandsTest, WhatTheyShow) {
         const char* golden;
         std::vector<std::string> arguments;
     };
-    const std::array<Shown, 6> all{{{"help.txt", {"--help"}},
-                                    {"help-generate.txt", {"generate", "--help"}},
-                                    {"help-screenshot.txt", {"screenshot", "--help"}},
-                                    {"version.txt", {"--version"}},
-                                    {"options.txt", {"options"}},
-                                    {"list.txt", {"list", kSample}}}};
+    const std::array<Shown, 14> all{{{"help.txt", {"--help"}},
+                                     {"help-new.txt", {"new", "--help"}},
+                                     {"help-generate.txt", {"generate", "--help"}},
+                                     {"help-recompile.txt", {"recompile", "--help"}},
+                                     {"help-screenshot.txt", {"screenshot", "--help"}},
+                                     {"help-open.txt", {"open", "--help"}},
+                                     {"help-projects.txt", {"projects", "--help"}},
+                                     {"help-contents.txt", {"contents", "--help"}},
+                                     {"help-settings.txt", {"settings", "--help"}},
+                                     {"help-settings-set.txt", {"settings", "set", "--help"}},
+                                     {"help-convert-contents.txt", {"convert-contents", "--help"}},
+                                     {"version.txt", {"--version"}},
+                                     {"options.txt", {"options"}},
+                                     {"list.txt", {"list", kSample}}}};
     for (const Shown& shown : all)
         ExpectGolden(std::string("cli/commands/") + shown.golden,
                      Run(shown.arguments).ExpectExit(0).ExpectErrors("").output);

@@ -11,6 +11,7 @@
 #include <fstream>
 #include <pty.h>
 #include <sstream>
+#include <sys/ioctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -79,6 +80,24 @@ std::string Started::ReadUntil(const std::string& lineStart) const {
     }
 }
 
+std::string Started::ReadTo(const std::string& part) const {
+    std::string text;
+    char byte = 0;
+    while (text.find(part) == std::string::npos) {
+        const ssize_t got = read(errors, &byte, 1);
+        if (got < 0 && errno == EINTR)
+            continue;
+        if (got <= 0)
+            break;
+        text += byte;
+    }
+    return text;
+}
+
+void Started::Type(const std::string& keys) const {
+    EXPECT_EQ(write(errors, keys.data(), keys.size()), static_cast<ssize_t>(keys.size()));
+}
+
 int Started::Wait() {
     int status = 0;
     while (waitpid(process, &status, 0) < 0 && errno == EINTR)
@@ -107,6 +126,10 @@ void ProgramTest::BecomeProgram(const std::vector<std::string>& arguments) const
     setenv("TOVIMAR_INSTALL", TOVIMAR_SOURCE_DIR "/install", 1);
     if (!searchPath.empty())
         setenv("PATH", searchPath.c_str(), 1);
+    for (const char* desktop : {"DISPLAY", "WAYLAND_DISPLAY", "TOVIMAR_VIEWER"})
+        unsetenv(desktop);
+    for (const auto& [name, value] : variables)
+        setenv(name.c_str(), value.c_str(), 1);
     std::vector<char*> pointers{const_cast<char*>(program.c_str())};
     for (const std::string& argument : arguments)
         pointers.push_back(const_cast<char*>(argument.c_str()));
@@ -116,10 +139,17 @@ void ProgramTest::BecomeProgram(const std::vector<std::string>& arguments) const
     _exit(127);
 }
 
-pid_t ProgramTest::Fork(const std::vector<std::string>& arguments, int output, int errors) const {
+pid_t ProgramTest::Fork(const std::vector<std::string>& arguments, int output, int errors,
+                        bool session) const {
     const pid_t process = fork();
     if (process != 0)
         return process;
+    const int input = session ? errors : open("/dev/null", O_RDONLY | O_CLOEXEC);
+    if (session) {
+        setsid();
+        ioctl(errors, TIOCSCTTY, 0);
+    }
+    dup2(input, STDIN_FILENO);
     dup2(output, STDOUT_FILENO);
     dup2(errors, STDERR_FILENO);
     BecomeProgram(arguments);
@@ -128,7 +158,7 @@ pid_t ProgramTest::Fork(const std::vector<std::string>& arguments, int output, i
 Outcome ProgramTest::Run(const std::vector<std::string>& arguments) {
     const int output = OpenForWriting(folder_ / "user/output.txt");
     const int errors = OpenForWriting(folder_ / "user/errors.txt");
-    Started run{Fork(arguments, output, errors), errors};
+    Started run{Fork(arguments, output, errors, /*session=*/false), errors};
     close(output);
     Outcome outcome;
     outcome.exitCode = run.Wait();
@@ -139,7 +169,7 @@ Outcome ProgramTest::Run(const std::vector<std::string>& arguments) {
 
 Started ProgramTest::Start(const std::vector<std::string>& arguments, Errors errors) {
     std::array<int, 2> ends{-1, -1};
-    if (errors == Errors::Terminal) {
+    if (errors != Errors::Pipe) {
         winsize size{24, 100, 0, 0};
         EXPECT_EQ(openpty(&ends[0], &ends[1], nullptr, nullptr, &size), 0);
         fcntl(ends[0], F_SETFD, FD_CLOEXEC);
@@ -148,7 +178,7 @@ Started ProgramTest::Start(const std::vector<std::string>& arguments, Errors err
         fcntl(ends[1], F_SETPIPE_SZ, kPipeSize);
     }
     const int output = OpenForWriting(folder_ / "user/output.txt");
-    const Started run{Fork(arguments, output, ends[1]), ends[0]};
+    const Started run{Fork(arguments, output, ends[1], errors == Errors::Session), ends[0]};
     close(output);
     close(ends[1]);
     return run;
@@ -158,6 +188,13 @@ void ProgramTest::Write(const std::string& name, const std::string& bytes) const
     const fs::path file = folder_ / name;
     fs::create_directories(file.parent_path());
     std::ofstream(file, std::ios::binary) << bytes;
+}
+
+fs::path ProgramTest::OwnInstallation() {
+    const fs::path install = folder_ / "user/install";
+    fs::copy(TOVIMAR_SOURCE_DIR "/install", install, fs::copy_options::recursive);
+    variables["TOVIMAR_INSTALL"] = install.string();
+    return install;
 }
 
 std::string ProgramTest::WithPlaceholders(std::string text) const {

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <map>
 #include <string>
 #include <sys/types.h>
 #include <vector>
@@ -39,6 +40,10 @@ struct Started {
     /// Up to and including the first line that begins so, or all of it.
     std::string ReadUntil(const std::string& lineStart) const;
     std::string ReadAll() const { return ReadUntil({}); }
+    /// Up to and including that text, which needn't end its line, or all of it.
+    std::string ReadTo(const std::string& part) const;
+    /// As if at the keyboard of a session's terminal: "\x03" is Ctrl+C, "\x04" the end of the input.
+    void Type(const std::string& keys) const;
     /// Its exit code, 128 and the signal for a killed one.
     int Wait();
 };
@@ -50,20 +55,25 @@ protected:
 
     /// The test's folder is the working folder, and holds the user's data and configuration.
     Outcome Run(const std::vector<std::string>& arguments);
-    enum class Errors { Pipe, Terminal };
+    /// A session has its standard input on the terminal, too.
+    enum class Errors { Pipe, Terminal, Session };
     Started Start(const std::vector<std::string>& arguments, Errors errors);
 
     const fs::path& Folder() const { return folder_; }
     void Write(const std::string& name, const std::string& bytes) const;
     std::string WithPlaceholders(std::string text) const;
+    /// A copy of the installation for tests that change it; its folder.
+    fs::path OwnInstallation();
 
     std::string program = TOVIMAR_PROGRAM;
     /// PATH of the program; that of the test when it is empty.
     std::string searchPath;
+    /// Further variables of the program's surroundings.
+    std::map<std::string, std::string> variables;
 
 private:
     [[noreturn]] void BecomeProgram(const std::vector<std::string>& arguments) const;
-    pid_t Fork(const std::vector<std::string>& arguments, int output, int errors) const;
+    pid_t Fork(const std::vector<std::string>& arguments, int output, int errors, bool session) const;
     fs::path folder_;
 };
 
