@@ -129,7 +129,8 @@ ResultCode Trapped(const char* className, const char* operationName, const std::
         return kSuccess;
     } catch (const std::exception& failure) {
         const RaisedError error = AsRaisedError(failure);
-        if (error.Number() == kGeneralFailure && platform::InterruptRequested()) {
+        if (error.Number() == kGeneralFailure &&
+            (platform::InterruptRequested() || Session::Run().generationInterrupted)) {
             Session::Run().generationInterrupted = true;
             return kGeneralFailure;
         }
@@ -138,6 +139,12 @@ ResultCode Trapped(const char* className, const char* operationName, const std::
         ReportError(error, className, operationName, text);
         return error.Number();
     }
+}
+
+void LeaveIfInterrupted() {
+    platform::Env().doEvents();
+    if (Session::Run().generationInterrupted)
+        throw RaisedError(kGeneralFailure, "The run was stopped.");
 }
 
 void PassOver(const std::function<void()>& step) {

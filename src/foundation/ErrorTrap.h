@@ -21,12 +21,15 @@ void rErrorMessage(ResultCode number, int line, const std::string& description, 
 std::string SystemDescription();
 
 /// Runs `operation` under the error trap of a public operation. 0 on success; a failure is reported under
-/// the two names and its number returned. An interrupt of the user is no failure of the program: it sets
+/// the two names and its number returned. A stopped run is no failure of the program: it sets
 /// `generationInterrupted` and gives kGeneralFailure unreported.
 ResultCode Trapped(const char* className, const char* operationName, const std::function<void()>& operation);
 /// The same; `detail` is only asked when the operation fails.
 ResultCode Trapped(const char* className, const char* operationName, const std::function<void()>& operation,
                    const std::function<std::string()>& detail);
+/// For loops over objects: lets Ctrl+C be seen, and ends the operation in which it stands when the run was
+/// stopped. The trap around it tells nobody of it.
+void LeaveIfInterrupted();
 /// Runs `step` and drops its failure, for steps whose failing must not stop what follows.
 void PassOver(const std::function<void()>& step);
 

@@ -127,6 +127,7 @@ void clsFrmRptHelpContextIds::AssignHelpContextIds() {
         HostMeter meter("Assigning help context Ids...", static_cast<std::int32_t>(forms_.Count()));
         std::int32_t position = 0;
         for (const std::string& name : forms_) {
+            LeaveIfInterrupted();
             AssignHelpContextIdsForForm(name);
             meter.Update(++position);
         }
@@ -209,6 +210,7 @@ void clsFrmRptHelpContextIds::SetHelpContextIds() {
         std::string defines = IncludeFileHead();
         std::int32_t position = 0;
         for (const std::string& name : forms_) {
+            LeaveIfInterrupted();
             if (const std::string line = SetHelpContextIdsForForm(name); !line.empty())
                 defines += line + "\r\n";
             meter.Update(++position);

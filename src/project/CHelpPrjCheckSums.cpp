@@ -113,8 +113,10 @@ CHelpPrjFileCheckSum& CHelpPrjCheckSums::GetCheckSumObject(const std::string& vs
 
 ResultCode CHelpPrjCheckSums::Recalc(const std::vector<std::string>* rcol) {
     const auto names = rcol != nullptr ? *rcol : platform::Env().files->ListFiles(folder_, "*.htm");
-    for (const auto& name : names)
+    for (const auto& name : names) {
+        LeaveIfInterrupted();
         GetCheckSumObject(folder_ + name, /*vfRecalc=*/true);
+    }
     return kSuccess;
 }
 

@@ -15,7 +15,9 @@ ResultCode CHelpPrjTree::SaveHHC(const std::string& vstrHHCFileFullPath, bool vf
         "CHelpPrjTree", "SaveHHC",
         [&] {
             readOnly = ExistsAndReadOnly(vstrHHCFileFullPath);
-            PrintSitemap(vstrHHCFileFullPath, GetHHCStr(vfForceContentsRebuild));
+            auto contents = GetHHCStr(vfForceContentsRebuild);
+            LeaveIfInterrupted();
+            PrintSitemap(vstrHHCFileFullPath, std::move(contents));
         },
         [&] { return ReadOnlyDetail(readOnly) + kCrLf + "HHCFileFullPath = " + vstrHHCFileFullPath; });
 }
@@ -55,6 +57,7 @@ ResultCode CHelpPrjTree::MakeAndSaveHHK(const std::string& vstrHHKFileFullPath) 
             auto& index = generator != nullptr ? generator->HelpIndex() : *own;
             if (root_ != nullptr)
                 root_->AddIndexLinks(index);
+            LeaveIfInterrupted();
             PrintSitemap(vstrHHKFileFullPath, index.HHKContents());
         },
         [&] { return "HHKFileFullPath = " + vstrHHKFileFullPath + kCrLf + ReadOnlyDetail(readOnly); });

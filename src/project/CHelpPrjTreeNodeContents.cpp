@@ -131,6 +131,7 @@ bool CHelpPrjTreeNode::HasContentsEntry() const {
 }
 
 void CHelpPrjTreeNode::AppendObjectChildren(std::string& out, std::int32_t level, ContentsStyle& style) {
+    LeaveIfInterrupted();
     // What the contents file has renewed a moment ago needn't be renewed for the web help.
     auto contents =
         HelpPrjTree == nullptr ? nullptr : HelpPrjTree->Definitions().KnownContents(XmlFormFullPath());

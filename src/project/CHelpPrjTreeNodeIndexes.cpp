@@ -1,4 +1,5 @@
 #include "foundation/CAddInProject.h"
+#include "foundation/ErrorTrap.h"
 #include "foundation/Session.h"
 #include "platform/Environment.h"
 #include "platform/text/Text.h"
@@ -50,6 +51,7 @@ void CHelpPrjTreeNode::AddIndexLinks(clsHHK& robjIndex) {
     const auto* project = Session::CurrentProject();
     if (IsObjectNode() && project != nullptr && HelpPrjTree != nullptr &&
         platform::Env().files->FolderExists(project->XmlFormsFolder())) {
+        LeaveIfInterrupted();
         auto& definitions = HelpPrjTree->Definitions();
         if (const auto known = definitions.KnownContents(XmlFormFullPath()))
             robjIndex.AddLinks(known->links, known->topicFile);

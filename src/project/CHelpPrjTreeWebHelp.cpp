@@ -87,6 +87,7 @@ ResultCode CHelpPrjTree::MakeJavaHelp2(CAddInProject& robjPrj) {
     CopyCommonFiles(robjPrj.Folder);
     std::string options;
     const auto tree = GetTreeStr(options, /*vfForceContentsRebuild=*/true);
+    LeaveIfInterrupted();
     SortIndexOptions(options, kOptionIndent);
     const auto* parameters = Session::Parameters();
     const auto styleSheet = parameters == nullptr ? std::string() : parameters->CSSFullPath();

@@ -54,7 +54,8 @@ struct ApplicationSummary {
     std::vector<std::string> notes;
 };
 
-/// Reads the designs of all forms and reports for their captions. Raises as OpenAccessApplication.
+/// Reads the designs of all forms and reports for their captions. Ctrl+C cuts the list short. Raises as
+/// OpenAccessApplication.
 ApplicationSummary SummarizeApplication(const std::string& nativePath);
 /// The same of an opened application; what was read stays with it.
 ApplicationSummary SummarizeApplication(const HostObject& application);

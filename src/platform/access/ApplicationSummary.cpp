@@ -1,4 +1,5 @@
 #include "platform/Error.h"
+#include "platform/Interrupt.h"
 #include "platform/access/AccessApplication.h"
 #include "platform/access/ApplicationModel.h"
 #include "platform/files/Paths.h"
@@ -81,9 +82,12 @@ ApplicationSummary SummarizeModel(ApplicationModel& model) {
     summary.name = BaseNameOf(model.FullName());
     for (const auto kind : {ObjectKind::Table, ObjectKind::Query, ObjectKind::Form, ObjectKind::Report,
                             ObjectKind::Macro, ObjectKind::Module})
-        for (const auto& name : model.Names(kind))
+        for (const auto& name : model.Names(kind)) {
+            if (InterruptRequested())
+                return summary;
             if (!IsSystemTable(kind, name))
                 summary.objects.push_back(Summarize(model, kind, name));
+        }
     AddNote(summary.objects, ObjectKind::Table, "table", summary.notes);
     AddNote(summary.objects, ObjectKind::Query, "query", summary.notes);
     AddNote(summary.objects, ObjectKind::Form, "form", summary.notes);
