@@ -42,6 +42,14 @@ bool TakeSetting(Arguments& parsed) {
     return setting.complaint.empty();
 }
 
+/// The parser only says that a command is missing.
+std::string Complaint(const CLI::App& app, const CLI::ParseError& error, int count,
+                      const char* const* arguments) {
+    if (count < 2 || arguments[1][0] == '-' || app.get_subcommands().size() > 0)
+        return error.what();
+    return "there is no command '" + std::string(arguments[1]) + "'";
+}
+
 Arguments Ended(int exitCode) {
     Arguments ended;
     ended.ended = true;
@@ -68,7 +76,7 @@ Arguments ParseCommandLine(int count, const char* const* arguments) {
     } catch (const CLI::ParseError& error) {
         if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success))
             return Ended(app.exit(error));
-        PrintError(error.what());
+        PrintError(Complaint(app, error, count, arguments));
         PrintHint(
             "Run \"tovimar --help\" for the commands and \"tovimar COMMAND --help\" for their arguments.");
         return Ended(kUsage);

@@ -1,11 +1,14 @@
 #include "cli/Columns.h"
 #include "cli/Commands.h"
 #include "cli/Console.h"
+#include "cli/Json.h"
 #include "platform/access/AccessApplication.h"
 #include "platform/text/Text.h"
 
 #include <algorithm>
 #include <array>
+#include <nlohmann/json.hpp>
+#include <tuple>
 
 namespace tovimar::cli {
 namespace {
@@ -33,19 +36,39 @@ void ShowKind(const ApplicationSummary& application, ObjectKind kind, const char
     }
 }
 
+constexpr std::array<std::tuple<ObjectKind, const char*, const char*>, 6> kKinds{
+    {{ObjectKind::Form, "Forms", "form"},
+     {ObjectKind::Report, "Reports", "report"},
+     {ObjectKind::Table, "Tables", "table"},
+     {ObjectKind::Query, "Queries", "query"},
+     {ObjectKind::Macro, "Macros", "macro"},
+     {ObjectKind::Module, "Modules", "module"}}};
+
+void ShowAsJson(const ApplicationSummary& application) {
+    nlohmann::ordered_json json{{"name", application.name}};
+    auto& objects = json["objects"] = nlohmann::ordered_json::array();
+    for (const auto& [kind, heading, word] : kKinds)
+        for (const ObjectSummary& object : application.objects)
+            if (object.kind == kind)
+                objects.push_back({{"kind", word},
+                                   {"name", object.name},
+                                   {"caption", object.caption},
+                                   {"nameOnly", !object.designKnown},
+                                   {"error", object.error}});
+    PrintJson(json);
+}
+
 } // namespace
 
 int List(const Arguments& arguments) {
     const ApplicationSummary application = platform::access::SummarizeApplication(arguments.source);
-    PrintResult(application.name);
-    constexpr std::array<std::pair<ObjectKind, const char*>, 6> kHeadings{{{ObjectKind::Form, "Forms"},
-                                                                           {ObjectKind::Report, "Reports"},
-                                                                           {ObjectKind::Table, "Tables"},
-                                                                           {ObjectKind::Query, "Queries"},
-                                                                           {ObjectKind::Macro, "Macros"},
-                                                                           {ObjectKind::Module, "Modules"}}};
-    for (const auto& [kind, heading] : kHeadings)
-        ShowKind(application, kind, heading);
+    if (arguments.json)
+        ShowAsJson(application);
+    else {
+        PrintResult(application.name);
+        for (const auto& [kind, heading, word] : kKinds)
+            ShowKind(application, kind, heading);
+    }
     for (const std::string& note : application.notes)
         PrintWarning(note);
     bool sound = true;

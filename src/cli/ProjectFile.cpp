@@ -9,6 +9,7 @@
 #include "platform/xml/XmlDocument.h"
 
 #include <algorithm>
+#include <unistd.h>
 
 namespace tovimar::cli {
 namespace {
@@ -110,6 +111,8 @@ std::string FindProjectFile(const std::string& typed) {
     auto& files = *platform::Env().files;
     const std::string path = files.FromNative(FullPath(typed));
     const bool folder = files.FolderExists(path);
+    if (folder && access(files.ToNative(path).c_str(), R_OK | X_OK) != 0)
+        throw Stop{"no permission to read '" + path + "'"};
     std::string file = folder ? OnlyProjectIn(path) : files.FileExists(path) ? path : std::string();
     // A name of the catalogue may also be that of a folder here, such as the application's.
     if (file.empty() && typed.find('/') == std::string::npos)

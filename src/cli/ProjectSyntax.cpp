@@ -87,6 +87,7 @@ void AddSourceSyntax(CLI::App& app, Arguments& parsed) {
                             Command::List, "tovimar list shop.accdb");
     AddSource(*list, parsed,
               "folder of text exports, database file (.accdb, .mdb), or a folder that holds both");
+    AddJson(*list, parsed);
     AddCommand(app, parsed, "options", "show the options of a help with their meaning", Command::Options,
                "tovimar options");
     auto* convert = AddCommand(app, parsed, "convert-contents",

@@ -7,6 +7,7 @@
 #include "foundation/Session.h"
 #include "generation/CTovimar.h"
 #include "generation/CTovimarCompiler.h"
+#include "generation/FolderOperations.h"
 #include "generation/OpenHelp.h"
 #include "generation/RunProgress.h"
 #include "host/server/CTovimarServer.h"
@@ -53,6 +54,8 @@ void Recompilation::LoadProject() {
     if (!platform::Env().files->FileExists(Session::CurrentProject()->HHCFullPath()))
         throw Stop{"the help of '" + source_.ProjectFile() +
                    "' wasn't generated yet\n\"tovimar generate\" writes its pages."};
+    if (const std::string& folder = Session::CurrentProject()->Folder; !TestFolderWritable(folder))
+        throw Stop{"no write access to '" + folder + "'"};
     auto& parameters = *Session::Parameters();
     parameters.CompileHTMLHelp = arguments_.compile;
     if (!arguments_.copyTo.empty())

@@ -14,6 +14,7 @@
 #include <filesystem>
 #include <nlohmann/json.hpp>
 #include <string_view>
+#include <unistd.h>
 
 namespace tovimar::cli {
 namespace {
@@ -85,6 +86,9 @@ int Set(const Arguments& arguments) {
     RefuseOption(arguments, option);
     const std::string path = PathOf(arguments);
     SettingsFile file(path);
+    if (access(platform::Env().files->ToNative(path).c_str(), W_OK) != 0)
+        throw Stop{"no permission to change '" + path + "'" +
+                   (arguments.project.empty() ? "\n--project changes the options of one help project." : "")};
     if (!arguments.project.empty() && !TheServer().BackUpHelpProjectFile(path))
         throw Stop{"no backup of '" + path + "' can be made; nothing was changed"};
     file.SetValue(option.name, StoredValue(option.name, arguments.settingValue));

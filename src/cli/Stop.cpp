@@ -16,7 +16,10 @@ void StopIfInterrupted() {
 }
 
 std::string FullPath(const std::string& native) {
-    return std::filesystem::weakly_canonical(std::filesystem::absolute(native)).string();
+    const std::filesystem::path whole = std::filesystem::absolute(native);
+    std::error_code unreadable;
+    const std::filesystem::path resolved = std::filesystem::weakly_canonical(whole, unreadable);
+    return (unreadable ? whole.lexically_normal() : resolved).string();
 }
 
 void ShowFile(const char* what, const std::string& path) {

@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <array>
 #include <csignal>
+#include <nlohmann/json.hpp>
 
 namespace tovimar::test {
 namespace {
@@ -54,6 +55,9 @@ TEST_F(CommandsTest, LinesThatAreNotUnderstood) {
         std::string errors;
     } cases[] = {
         {{}, "A subcommand is required\n" + hint},
+        {{"frobnicate", "x"}, "there is no command 'frobnicate'\n" + hint},
+        {{"projects", "frobnicate"}, "The following argument was not expected: frobnicate\n" + hint},
+        {{"open", "help", "one", "two"}, "The following argument was not expected: two\n" + hint},
         {{"generate"}, "SOURCE is required\n" + hint},
         {{"generate", "nowhere"}, "SOURCE: Path does not exist: nowhere\n" + hint},
         {{"generate", kSample, "--option", "AddHotSpot=True"},
@@ -71,6 +75,20 @@ TEST_F(CommandsTest, LinesThatAreNotUnderstood) {
     for (const auto& wrong : cases)
         Run(wrong.arguments).ExpectExit(2).ExpectOutput("").ExpectErrors("tovimar: error: " + wrong.errors);
     EXPECT_EQ(FilesBelow(Folder()), (std::vector<std::string>{"user/errors.txt", "user/output.txt"}));
+}
+
+TEST_F(CommandsTest, ObjectsAsJson) {
+    Write("app/forms/One.form", FormExport("The first"));
+    Write("app/forms/Two.form", "Version =21\r\nBegin Form\r\n");
+    const auto json = nlohmann::json::parse(Run({"list", "app", "--json"}).ExpectExit(1).output);
+    EXPECT_EQ(json["name"], "app");
+    ASSERT_EQ(json["objects"].size(), 2U);
+    EXPECT_EQ(json["objects"][0], (nlohmann::json{{"kind", "form"},
+                                                  {"name", "One"},
+                                                  {"caption", "The first"},
+                                                  {"nameOnly", false},
+                                                  {"error", ""}}));
+    EXPECT_NE(json["objects"][1]["error"], "");
 }
 
 TEST_F(CommandsTest, InAPipeARunIsQuiet) {

@@ -4,6 +4,7 @@
 #include <fstream>
 #include <gmock/gmock.h>
 #include <nlohmann/json.hpp>
+#include <unistd.h>
 
 namespace tovimar::test {
 namespace {
@@ -86,6 +87,14 @@ TEST_F(SettingsTest, WhatIsRefused) {
     refuses({"set", "Author", "\xff"}, "the value of Author isn't UTF-8");
     refuses({"get", "HelpProjectTitle"}, "HelpProjectTitle belongs to a help project; --project names it");
     EXPECT_EQ(ReadWhole(file_), before);
+    if (geteuid() != 0) { // whom nothing is forbidden
+        fs::permissions(file_, fs::perms::owner_read);
+        refuses({"set", "Author", "x"},
+                "no permission to change '<FOLDER>/user/install/Settings/vasmoraSettings.xml'\n"
+                "  --project changes the options of one help project.",
+                1);
+        fs::permissions(file_, fs::perms::owner_read | fs::perms::owner_write);
+    }
     std::ofstream(file_, std::ios::binary) << "<dataroot/>";
     refuses({"get", "Author"}, "'<FOLDER>/user/install/Settings/vasmoraSettings.xml' has no options", 1);
     std::ofstream(file_, std::ios::binary) << "<Settings><Options>";
