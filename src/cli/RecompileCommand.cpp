@@ -4,6 +4,7 @@
 #include "cli/Stop.h"
 #include "cli/Surroundings.h"
 #include "foundation/CAddInProject.h"
+#include "foundation/CAddInProjects.h"
 #include "foundation/Session.h"
 #include "generation/CTovimar.h"
 #include "generation/CTovimarCompiler.h"
@@ -73,6 +74,8 @@ int Recompilation::Make() {
     ShowWebHelpAndProject();
     if (!compiled || surroundings_.Boxes().errors > 0 || Session::Run().runErrorCount != 0)
         return kFailed;
+    // One that came from elsewhere is known from now on.
+    Session::Projects()->Save();
     if (arguments_.open)
         Show();
     return kDone;

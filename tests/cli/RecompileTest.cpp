@@ -96,6 +96,19 @@ TEST_F(RecompileTest, WhatCanNotBe) {
         .ExpectErrorsHold("tovimar: error: the help compiler isn't installed; nothing was written\n");
 }
 
+TEST_F(RecompileTest, AProjectFromElsewhereIsKnownOnceItsSourceWasNamed) {
+    Generate();
+    fs::remove_all(Folder() / "user");
+    fs::create_directory(Folder() / "user");
+    Run({"recompile", "help", "--no-compile"})
+        .ExpectExit(1)
+        .ExpectErrors(
+            "tovimar: error: it isn't known which application '<FOLDER>/help/shop.tvp' was made from\n"
+            "  --source names its exports or its database.\n");
+    Run({"recompile", "help", "--no-compile", "--source", "shop"}).ExpectExit(0);
+    Run({"recompile", "shop", "--no-compile"}).ExpectExit(0);
+}
+
 TEST_F(RecompileTest, OpenShowsWhatIsThere) {
     Generate();
     Run({"open", "help", "help"})
