@@ -38,19 +38,40 @@ bool IsPathStart(const std::string& text, std::size_t at) {
     return !(before >= 'a' && before <= 'z') && !(before >= '0' && before <= '9');
 }
 
-/// What ends a path that begins at `at`: the partner of the quote or bracket in front, or a character that
-/// no path holds.
-const char* PathEnds(const std::string& text, std::size_t at) {
+/// The partner of the quote or bracket in front of a path; 0 without one.
+char CloserAt(const std::string& text, std::size_t at) {
     switch (at == 0 ? ' ' : text[at - 1]) {
     case '\'':
-        return "'\r\n";
+        return '\'';
     case '[':
-        return "]\r\n";
+        return ']';
     case '(':
-        return ")\r\n";
+        return ')';
     default:
-        return "\"<>|\r\n";
+        return '\0';
     }
+}
+
+/// Names hold quotes and brackets too: "'Z:\Bob's help\a.htm'".
+bool GoesOnBehind(const std::string& text, std::size_t closer) {
+    if (closer + 1 >= text.size())
+        return false;
+    const char next = text::LowerAscii(text[closer + 1]);
+    return next == '\\' || (next >= 'a' && next <= 'z') || (next >= '0' && next <= '9') ||
+           static_cast<unsigned char>(next) >= 0x80;
+}
+
+/// Where the path that begins at `at` ends.
+std::size_t PathEnd(const std::string& text, std::size_t at) {
+    const char closer = CloserAt(text, at);
+    const std::string_view ends = closer != '\0' ? "\r\n" : "\"<>|\r\n";
+    for (std::size_t i = at + 1; i < text.size(); ++i) {
+        if (ends.find(text[i]) != std::string_view::npos)
+            return i;
+        if (closer != '\0' ? text[i] == closer && !GoesOnBehind(text, i) : IsPathStart(text, i))
+            return i;
+    }
+    return text.size();
 }
 
 } // namespace
@@ -62,7 +83,7 @@ std::string NativePathsInText(const std::string& text) {
             out += text[i++];
             continue;
         }
-        const std::size_t end = std::min(text.find_first_of(PathEnds(text, i), i), text.size());
+        const std::size_t end = PathEnd(text, i);
         out += platform::Env().files->ToNative(text.substr(i, end - i));
         i = end;
     }

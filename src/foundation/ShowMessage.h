@@ -42,7 +42,7 @@ bool UnattendedMessages();
 void UserWarningMessage(const std::string& vstrText);
 
 /// A text for a person: Windows paths in it ("Z:\a\b", "C:\a\b") become native ones. A path behind a quote
-/// or bracket ends at its partner, any other at the end of the line.
+/// or bracket ends at its partner, any other at the next path or the end of the line.
 std::string NativePathsInText(const std::string& text);
 
 } // namespace tovimar

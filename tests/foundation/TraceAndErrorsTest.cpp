@@ -85,6 +85,10 @@ TEST_F(MessagesTest, BoxesShowNativePaths) {
                                 Path("c") + "\r\nx"),
               "in '" + NativeFolder() + "/a' and [" + NativeFolder() + "/b/] abc:\\d D:\\e\r\n" +
                   NativeFolder() + "/c\r\nx");
+    EXPECT_EQ(NativePathsInText("copy " + Path("a (1)\\b") + " to " + Path("c") + ": no"),
+              "copy " + NativeFolder() + "/a (1)/b to " + NativeFolder() + "/c: no");
+    EXPECT_EQ(NativePathsInText("'" + Path("Bob's\\x (1)\\a") + "' (" + Path("x (1)\\b") + ")."),
+              "'" + NativeFolder() + "/Bob's/x (1)/a' (" + NativeFolder() + "/x (1)/b).");
 }
 
 TEST_F(MessagesTest, UnattendedAnswersAreTraced) {
