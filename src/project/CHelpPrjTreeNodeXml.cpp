@@ -7,6 +7,7 @@
 #include "project/CHelpPrjTreeNode.h"
 #include "project/ITreeView.h"
 #include "project/SitemapText.h"
+#include "uimodel/DefinitionText.h"
 
 #include <algorithm>
 #include <string_view>
@@ -19,16 +20,7 @@ namespace {
 
 /// Values that go unencoded hold file names and the like; what would break the file is written as an
 /// entity all the same.
-void AppendPlain(std::string& out, std::string_view value) {
-    for (;;) {
-        const auto at = value.find_first_of("\"&<>");
-        out += value.substr(0, at);
-        if (at == std::string_view::npos)
-            return;
-        out += value[at] == '"' ? "&quot;" : value[at] == '&' ? "&amp;" : value[at] == '<' ? "&lt;" : "&gt;";
-        value.remove_prefix(at + 1);
-    }
-}
+constexpr auto AppendPlain = definition::AppendEscaped;
 
 /// The name alone; most values are one already.
 std::string FileNameIn(std::string_view value) {

@@ -48,19 +48,25 @@ void AppendPlain(std::string& out, std::string_view opening, std::string_view va
 
 std::string Escaped(std::string_view value) {
     std::string escaped;
-    for (const char c : value) {
-        if (c == '&')
-            escaped += "&amp;";
-        else if (c == '<')
-            escaped += "&lt;";
-        else if (c == '"')
-            escaped += "&quot;";
-        else if (static_cast<unsigned char>(c) < ' ')
-            escaped.append("&#").append(std::to_string(c)).append(";");
-        else
-            escaped += c;
-    }
+    AppendEscaped(escaped, value);
     return escaped;
+}
+
+void AppendEscaped(std::string& out, std::string_view value) {
+    std::size_t done = 0;
+    for (std::size_t i = 0; i < value.size(); ++i) {
+        const char c = value[i];
+        const bool control = static_cast<unsigned char>(c) < ' ';
+        if (c != '&' && c != '<' && c != '"' && !control)
+            continue;
+        out.append(value, done, i - done);
+        done = i + 1;
+        if (control)
+            out.append("&#").append(std::to_string(c)).append(";");
+        else
+            out += c == '&' ? "&amp;" : c == '<' ? "&lt;" : "&quot;";
+    }
+    out.append(value, done);
 }
 
 void AppendPair(std::string& out, std::string_view opening, std::int32_t first, std::int32_t second) {

@@ -21,6 +21,8 @@ void AppendUnlessEmpty(std::string& out, std::string_view opening, std::string_v
 /// The same for a value that the format doesn't encode: only what would break the element is escaped.
 void AppendPlain(std::string& out, std::string_view opening, std::string_view value);
 std::string Escaped(std::string_view value);
+/// The same, behind a text: "&", "<", quotes and control characters become entities.
+void AppendEscaped(std::string& out, std::string_view value);
 /// Two numbers with a comma and a blank between them.
 void AppendPair(std::string& out, std::string_view opening, std::int32_t first, std::int32_t second);
 /// Two blanks a level; a level that no tree reaches counts as the deepest one.
