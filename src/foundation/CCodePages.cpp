@@ -3,6 +3,7 @@
 #include "foundation/CXMLFile.h"
 #include "foundation/ErrorTrap.h"
 #include "foundation/Paths.h"
+#include "platform/text/Text.h"
 #include "platform/xml/XmlDocument.h"
 
 namespace tovimar {
@@ -18,7 +19,7 @@ ResultCode CCodePages::Load(const std::string& vstrXmlDefFileFullPath) {
                               file.XmlParseError.reason + " in '" + vstrXmlDefFileFullPath + "'",
                               "CCodePages.Load");
         const auto textOf = [](const XmlNode& language, const char* name) {
-            return language.selectSingleNode(name).text();
+            return text::TrimWhitespace(language.selectSingleNode(name).text());
         };
         for (const XmlNode& language : document.selectSingleNode("/CodePages").childElements()) {
             CCodePage page{textOf(language, "LName"), textOf(language, "LCode"),

@@ -37,6 +37,10 @@ TEST_F(NameEncodingTest, CodePagesByLanguage) {
     EXPECT_EQ(english->CP1, "1252");
     EXPECT_EQ(english->HHPLName, "0x409 English (United States)");
     EXPECT_EQ(pages.GetCodePageByLanguageCode("XX"), nullptr);
+    EXPECT_EQ(pages.Load(WriteFile("own.xml", "<CodePages><L><LCode>\r\n XY </LCode><CP1> 1250\r\n</CP1></L>"
+                                              "</CodePages>")),
+              0);
+    EXPECT_EQ(pages.GetCodePageByLanguageCode("XY")->CP1, "1250");
     EXPECT_NE(pages.Load(WriteFile("broken.xml", "<CodePages>")), 0);
     EXPECT_TRUE(pages.Pages().Empty());
 }

@@ -1,9 +1,12 @@
 #include "platform/files/Paths.h"
 #include "support/FakeEnvironment.h"
 
+#include <fcntl.h>
 #include <filesystem>
 #include <fstream>
+#include <sys/file.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 namespace tovimar::platform {
 namespace {
@@ -104,6 +107,33 @@ TEST_F(FilesTest, ReplacesFilesWhole) {
     EXPECT_EQ(ReadFile(path), "n1x");
     files.AppendFile(path, "+");
     EXPECT_EQ(files.FileLength(path), 4U);
+}
+
+TEST_F(FilesTest, LastingFilesKeepLinkAndRights) {
+    const std::string path = Path("new.txt");
+    files.WriteFileToDisk(path, "1");
+    chmod((NativeFolder() + "/new.txt").c_str(), 0640);
+    fs::create_symlink(NativeFolder() + "/new.txt", NativeFolder() + "/link.txt");
+    files.WriteFileToDisk(Path("LINK.txt"), "2");
+    EXPECT_TRUE(fs::is_symlink(NativeFolder() + "/link.txt"));
+    EXPECT_EQ(ReadFile(path), "2");
+    struct stat info {};
+    EXPECT_EQ(stat((NativeFolder() + "/new.txt").c_str(), &info), 0);
+    EXPECT_EQ(info.st_mode & 0777U, 0640U);
+    EXPECT_EQ(files.ListFiles(Folder(), "*.*"), (std::vector<std::string>{"link.txt", "new.txt"}));
+    EXPECT_EQ(FailureOf([&] { files.WriteFileToDisk(Path("none\\a.txt"), "x"); }), 76);
+}
+
+TEST_F(FilesTest, ALockedFolderIsFreeOnceTheLockIsGone) {
+    const int other = open(NativeFolder().c_str(), O_RDONLY | O_DIRECTORY);
+    {
+        const auto lock = files.LockFolder(Folder());
+        ASSERT_NE(lock, nullptr);
+        EXPECT_NE(flock(other, LOCK_EX | LOCK_NB), 0);
+    }
+    EXPECT_EQ(flock(other, LOCK_EX | LOCK_NB), 0);
+    close(other);
+    EXPECT_EQ(files.LockFolder(Path("none")), nullptr);
 }
 
 TEST_F(FilesTest, ReadOnlyFilesStand) {
