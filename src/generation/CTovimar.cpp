@@ -9,6 +9,7 @@
 #include "foundation/Session.h"
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimarCompiler.h"
+#include "generation/FolderOperations.h"
 #include "generation/HelpUtilities.h"
 #include "generation/IHelpWizardForm.h"
 #include "generation/RunProgress.h"
@@ -212,6 +213,10 @@ ResultCode CTovimar::GenerateHTMLForProject(bool /*vfCompile*/, bool vfRegenerat
         CompilerOutput.clear();
         CompilerExitCode = 0;
         CreateFolderPath(parameters_->FolderForGeneratedImages());
+        for (const auto& folder :
+             {parameters_->FolderForGeneratedHelp(), parameters_->FolderForGeneratedImages(),
+              platform::Join(parameters_->FolderForGeneratedHelp(), "xml")})
+            RemoveUnfinishedFiles(folder);
         // Pages, context ids, contents and index of one run all ask for the same definitions.
         const DefinitionCache::Holder definitions(HelpProjectTree().Definitions());
 

@@ -198,8 +198,13 @@ void CTovimarActions::TakeOverEarlierProject(CAddInProject& project) {
         return;
     earlierProjectFile_ = project.Name + ".tvp";
     const XmlNode root = file.selectSingleNode("//Project");
-    project.HUID = root.attribute("HUID");
-    project.SUID = root.attribute("SUID");
+    // A project file that was made again from its tree has none.
+    const auto kept = [&](const char* name, const std::string& inCatalogue) {
+        const std::string inFile = root.attribute(name);
+        return inFile.empty() ? inCatalogue : inFile;
+    };
+    project.HUID = kept("HUID", listed == nullptr ? std::string() : listed->HUID);
+    project.SUID = kept("SUID", listed == nullptr ? std::string() : listed->SUID);
     if (listed != nullptr) {
         listed->IsNew = true;
         Session::Projects()->RemoveTempProjects();

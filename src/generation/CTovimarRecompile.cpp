@@ -6,6 +6,7 @@
 #include "foundation/ShowMessage.h"
 #include "generation/CTovimar.h"
 #include "generation/CTovimarCompiler.h"
+#include "generation/FolderOperations.h"
 #include "generation/HelpCompiler.h"
 #include "generation/HelpUtilities.h"
 #include "generation/OpenHelp.h"
@@ -98,6 +99,8 @@ void CTovimarCompiler::WriteProjectFiles(CAddInProject& project) {
     generator.CompilerOutput.clear();
     generator.CompilerExitCode = 0;
     RunData().ProgressBarInit("Starting recompile...", 6);
+    for (const auto& folder : {project.Folder, project.PicsSubfolderPath(), project.XmlFormsFolder()})
+        RemoveUnfinishedFiles(folder);
     // Saving an empty tree would cost the project.
     if (generator.HelpProjectTree().Root() == nullptr)
         generator.LoadTreviewForActiveProject();

@@ -41,8 +41,8 @@ bool TestFolderWritable(const std::string& vstrFolder) {
     auto& files = *platform::Env().files;
     const std::string probe = platform::Join(vstrFolder, "test.txt");
     try {
-        // Somebody's own file of that name is only opened.
-        const bool taken = files.FileExists(probe);
+        // Somebody's own file of that name is only opened; an empty one is what a killed run has left.
+        const bool taken = files.FileExists(probe) && files.FileLength(probe) > 0;
         files.AppendFile(probe, {});
         if (!taken)
             files.DeleteFile(probe);
@@ -95,6 +95,14 @@ void CopyFilesByMask(const std::string& vstrSourceFolder, const std::string& vst
         return;
     for (const std::string& file : files.ListFiles(vstrSourceFolder, vstrMask))
         files.CopyFile(platform::Join(vstrSourceFolder, file), platform::Join(vstrTargetFolder, file));
+}
+
+void RemoveUnfinishedFiles(const std::string& vstrFolder) {
+    auto& files = *platform::Env().files;
+    if (vstrFolder.empty() || !files.FolderExists(vstrFolder))
+        return;
+    for (const auto& name : files.ListFiles(vstrFolder, platform::FileSystem::kUnfinishedFiles))
+        PassOver([&] { files.DeleteFile(platform::Join(vstrFolder, name)); });
 }
 
 std::int32_t GetPathAttributes(const std::string& vstrPath) {

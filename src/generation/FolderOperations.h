@@ -19,6 +19,9 @@ std::string MakeBackupForFolder(const std::string& vstrFolder);
 void CopyFilesByMask(const std::string& vstrSourceFolder, const std::string& vstrTargetFolder,
                      const std::string& vstrMask);
 
+/// Deletes what a killed run has left unfinished in the folder; a missing folder has nothing.
+void RemoveUnfinishedFiles(const std::string& vstrFolder);
+
 /// Bits of `GetPathAttributes`.
 enum PathAttributes : std::int32_t {
     kAttributeReadOnly = 1,

@@ -32,6 +32,9 @@ class FileSystem {
 public:
     virtual ~FileSystem() = default;
 
+    /// Names of files that are being written beside the ones that they are to replace.
+    static constexpr const char* kUnfinishedFiles = ".tovimar-??????";
+
     virtual bool FileExists(const std::string& path) = 0;
     virtual bool FolderExists(const std::string& path) = 0;
     virtual std::string ReadFile(const std::string& path) = 0;

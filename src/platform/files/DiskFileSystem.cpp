@@ -10,6 +10,7 @@
 #include <cerrno>
 #include <cstdio>
 #include <fcntl.h>
+#include <optional>
 #include <unistd.h>
 #include <utility>
 
@@ -76,12 +77,16 @@ void SyncFolderOf(const std::string& nativePath) {
     }
 }
 
-/// A file that isn't there yet replaces nothing, so it is written in place; one that fails half-way goes.
+/// A file that isn't there yet gets its name when it is finished, which is cheaper than a second name and a
+/// rename and leaves nothing behind a killed program. File systems that can't do this get the rename.
 void WriteNewFile(const std::string& nativePath, std::string_view bytes) {
-    NativeFile file(nativePath, O_WRONLY | O_CREAT | O_EXCL);
+    std::optional<NativeFile> file = NativeFile::UnnamedBeside(nativePath);
+    if (file)
+        file->WriteAll(bytes);
+    if (!file || !file->GiveName())
+        return ReplaceFile(nativePath, bytes);
     try {
-        file.WriteAll(bytes);
-        file.Close();
+        file->Close();
     } catch (...) {
         unlink(nativePath.c_str());
         throw;

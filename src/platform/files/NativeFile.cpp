@@ -45,6 +45,19 @@ NativeFile NativeFile::TemporaryBeside(const std::string& target) {
     return file;
 }
 
+std::optional<NativeFile> NativeFile::UnnamedBeside(const std::string& target) {
+    const std::string folder = target.substr(0, target.rfind('/') + 1) + ".";
+    const int descriptor = open(folder.c_str(), O_TMPFILE | O_WRONLY | O_CLOEXEC, 0666);
+    if (descriptor < 0)
+        return std::nullopt;
+    return NativeFile(descriptor, target, target);
+}
+
+bool NativeFile::GiveName() {
+    const std::string self = "/proc/self/fd/" + std::to_string(descriptor_);
+    return linkat(AT_FDCWD, self.c_str(), AT_FDCWD, path_.c_str(), AT_SYMLINK_FOLLOW) == 0;
+}
+
 NativeFile::~NativeFile() {
     if (descriptor_ >= 0)
         close(descriptor_);

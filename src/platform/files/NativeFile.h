@@ -1,5 +1,6 @@
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <sys/stat.h>
@@ -14,6 +15,12 @@ public:
     /// A fresh file beside `target` with the access rights, and where that is allowed the owner, that
     /// `target` has, or a new file gets.
     static NativeFile TemporaryBeside(const std::string& target);
+    /// A fresh file without a name where `target` is to stand, gone when it never gets it. None where the
+    /// file system has no such files, or the folder can't be written to.
+    static std::optional<NativeFile> UnnamedBeside(const std::string& target);
+    /// Of an unnamed file, the name that it was opened for. False where it can't get it, for one because it
+    /// is taken by now.
+    bool GiveName();
     ~NativeFile();
     NativeFile(NativeFile&& other) noexcept;
     NativeFile& operator=(NativeFile&&) = delete;
