@@ -73,6 +73,17 @@ int Get(const Arguments& arguments) {
     return kDone;
 }
 
+/// The user's own settings begin as a copy of the shipped ones.
+std::string OwnSettings() {
+    auto& files = *platform::Env().files;
+    const std::string own = UserSettingsFile();
+    if (!files.FileExists(own)) {
+        files.MakeFolders(platform::FolderOf(own));
+        files.WriteFileToDisk(own, files.ReadFile(ShippedSettingsFile()));
+    }
+    return own;
+}
+
 /// A style sheet that was typed as a path is one of this machine.
 std::string StoredValue(const std::string& name, const std::string& value) {
     const bool path = value.find('/') != std::string::npos &&
@@ -84,7 +95,7 @@ std::string StoredValue(const std::string& name, const std::string& value) {
 int Set(const Arguments& arguments) {
     const OptionDescription& option = Described(arguments.settingName);
     RefuseOption(arguments, option);
-    const std::string path = PathOf(arguments);
+    const std::string path = arguments.project.empty() ? OwnSettings() : PathOf(arguments);
     SettingsFile file(path);
     if (access(platform::Env().files->ToNative(path).c_str(), W_OK) != 0)
         throw Stop{"no permission to change '" + path + "'" +

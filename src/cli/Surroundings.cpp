@@ -128,7 +128,7 @@ Surroundings::~Surroundings() {
 
 std::string Surroundings::MissingInstallation() const {
     auto& files = *platform::Env().files;
-    const std::string settings = GlobalSettingsFile();
+    const std::string settings = ShippedSettingsFile();
     const std::string templates = ParameterizedTemplatesFolder();
     for (const auto& [path, there] : {std::pair(settings, files.FileExists(settings)),
                                       std::pair(templates, files.FolderExists(templates))})

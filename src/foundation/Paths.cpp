@@ -61,8 +61,17 @@ std::string SettingsFolder() {
     return Redirected("Settings.rdt", InstallationFolder() + "Settings\\");
 }
 
-std::string GlobalSettingsFile() {
+std::string ShippedSettingsFile() {
     return SettingsFolder() + ProductFile("Settings.xml");
+}
+
+std::string UserSettingsFile() {
+    return platform::FolderOf(CataloguePath()) + ProductFile("Settings.xml");
+}
+
+std::string GlobalSettingsFile() {
+    const std::string own = UserSettingsFile();
+    return Env().files->FileExists(own) ? own : ShippedSettingsFile();
 }
 
 std::string WizardDefinitionFile() {

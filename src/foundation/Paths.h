@@ -10,7 +10,12 @@ namespace tovimar {
 /// Value "InstallPath" of the registry, else the program's folder.
 std::string InstallationFolder();
 std::string SettingsFolder();
-/// "vasmoraSettings.xml" of the settings folder.
+/// "vasmoraSettings.xml" of the settings folder, as it was installed. Nothing writes it: an installation
+/// belongs to all users of a machine.
+std::string ShippedSettingsFile();
+/// The user's own one, in the folder of the catalogue; where settings are saved.
+std::string UserSettingsFile();
+/// The settings in force: the user's own file once it is there, else the shipped one.
 std::string GlobalSettingsFile();
 std::string WizardDefinitionFile();
 /// "vasmoraProjects.xml" of the user's application data.

@@ -123,7 +123,7 @@ ResultCode CTovimarActions::CheckAndSaveOptions() {
     HostAgent().ProgressMeterInit("Saving settings...", 2);
     HostAgent().ProgressMeterUpdate(1);
     const ResultCode failed =
-        Session::Settings() == nullptr ? kSuccess : Session::Settings()->Save(GlobalSettingsFile());
+        Session::Settings() == nullptr ? kSuccess : Session::Settings()->Save(UserSettingsFile());
     if (failed == kSuccess)
         TakeRunOptions();
     return failed;

@@ -195,7 +195,7 @@ void frmScreenshotOptions::ApplyClick() {
         return;
     StoreValues();
     if (auto* settings = Session::Settings())
-        settings->Save(GlobalSettingsFile());
+        settings->Save(UserSettingsFile());
 }
 
 } // namespace tovimar

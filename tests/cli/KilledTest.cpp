@@ -19,7 +19,6 @@ protected:
                                       ControlExport("TextBox", "txtName")));
         Write("shop/forms/Orders.form", FormExport("Orders", ControlExport("TextBox", "txtNo")));
         Write("shop/tbldefs/Goods.sql", "CREATE TABLE [Goods] ([ID] AUTOINCREMENT, [Name] VARCHAR (50))");
-        OwnInstallation();
         Run(generate).ExpectExit(0);
         // The second run has an earlier project to take over, as each run after a killed one has.
         Run(generate).ExpectExit(0);

@@ -21,7 +21,9 @@ protected:
     void Set(const std::string& name, const std::string& value) {
         Run({"settings", "set", name, value}).ExpectExit(0).ExpectErrors("").ExpectOutput("");
     }
+    /// What was installed, and the user's own.
     fs::path file_;
+    const fs::path own_ = Folder() / "user/tovimar/drive_c/Application Data/Tovimar/vasmoraSettings.xml";
 };
 
 TEST_F(SettingsTest, OneIsChangedAndAllElseStays) {
@@ -33,6 +35,7 @@ TEST_F(SettingsTest, OneIsChangedAndAllElseStays) {
     Set("SnapshotFormat", "Jpeg");
     Set("Copyright", "");
     EXPECT_EQ(Get("Copyright"), "\n");
+    EXPECT_EQ(ReadWhole(own_), before);
     EXPECT_EQ(ReadWhole(file_), before);
 }
 
@@ -42,7 +45,7 @@ TEST_F(SettingsTest, OneThatTheFileLacksIsAdded) {
     text.erase(line, text.find('\n', line) + 1 - line);
     std::ofstream(file_, std::ios::binary) << text;
     Set("Author", "A. Smith");
-    EXPECT_EQ(ReadWhole(file_),
+    EXPECT_EQ(ReadWhole(own_),
               text::ReplaceAll(text, "</Options>",
                                "    <Option Name = \"Author\" Value = \"A. Smith\" />\n</Options>"));
 }
@@ -87,17 +90,21 @@ TEST_F(SettingsTest, WhatIsRefused) {
     refuses({"set", "Author", "\xff"}, "the value of Author isn't UTF-8");
     refuses({"get", "HelpProjectTitle"}, "HelpProjectTitle belongs to a help project; --project names it");
     EXPECT_EQ(ReadWhole(file_), before);
+    EXPECT_FALSE(fs::exists(own_));
+    Set("Author", "A");
     if (geteuid() != 0) { // whom nothing is forbidden
-        fs::permissions(file_, fs::perms::owner_read);
+        fs::permissions(own_, fs::perms::owner_read);
         refuses({"set", "Author", "x"},
-                "no permission to change '<FOLDER>/user/install/Settings/vasmoraSettings.xml'\n"
+                "no permission to change '<FOLDER>/user/tovimar/drive_c/Application "
+                "Data/Tovimar/vasmoraSettings.xml'\n"
                 "  --project changes the options of one help project.",
                 1);
-        fs::permissions(file_, fs::perms::owner_read | fs::perms::owner_write);
+        fs::permissions(own_, fs::perms::owner_read | fs::perms::owner_write);
     }
-    std::ofstream(file_, std::ios::binary) << "<dataroot/>";
-    refuses({"get", "Author"}, "'<FOLDER>/user/install/Settings/vasmoraSettings.xml' has no options", 1);
-    std::ofstream(file_, std::ios::binary) << "<Settings><Options>";
+    std::ofstream(own_, std::ios::binary) << "<dataroot/>";
+    refuses({"get", "Author"},
+            "'<FOLDER>/user/tovimar/drive_c/Application Data/Tovimar/vasmoraSettings.xml' has no options", 1);
+    std::ofstream(own_, std::ios::binary) << "<Settings><Options>";
     EXPECT_THAT(Run({"settings", "set", "Author", "x"}).ExpectExit(1).errors, HasSubstr("can't be read: "));
 }
 

@@ -1,6 +1,7 @@
 #include "foundation/CXmlMessages.h"
 #include "foundation/Paths.h"
 #include "foundation/Session.h"
+#include "platform/files/Paths.h"
 #include "support/FakeEnvironment.h"
 
 namespace tovimar {
@@ -60,6 +61,9 @@ TEST_F(PathsTest, LieBelowTheProgramWithoutARegistry) {
     EXPECT_TRUE(program.ends_with("\\install\\")) << program;
     EXPECT_EQ(InstallationFolder(), program);
     EXPECT_EQ(GlobalSettingsFile(), program + "Settings\\vasmoraSettings.xml");
+    environment->files->MakeFolders(platform::FolderOf(UserSettingsFile()));
+    environment->files->WriteFile(UserSettingsFile(), "<Settings/>");
+    EXPECT_EQ(GlobalSettingsFile(), platform::FolderOf(CataloguePath()) + "vasmoraSettings.xml");
     EXPECT_EQ(WizardDefinitionFile(), program + "Settings\\vasmoraWizardDef.xml");
     EXPECT_EQ(LogFolder(), program);
     EXPECT_EQ(CataloguePath(), "C:\\Application Data\\Tovimar\\vasmoraProjects.xml");

@@ -162,7 +162,7 @@ TEST_F(WizardActionsTest, FinishGeneratesAndAStoppedRunIsTold) {
     EXPECT_EQ(Path("new help\\"), Session::CurrentProject()->Folder);
     EXPECT_FALSE(Session::CurrentProject()->IsNew) << "listed and saved";
     EXPECT_TRUE(environment->files->FileExists(Path("new help\\Shop.tvp")));
-    EXPECT_TRUE(environment->files->FileExists(Path("install\\Settings\\vasmoraSettings.xml")));
+    EXPECT_TRUE(environment->files->FileExists(UserSettingsFile()));
     EXPECT_EQ((Calls{"ResetIDEWindows"}), Calls(sent.end() - 1, sent.end()));
 
     Open();
