@@ -257,8 +257,8 @@ TEST_F(ScreenshotOptionsTest, TheActionTakesTheActiveObjectAndKeepsItsTopic) {
     EXPECT_NE(sent[1].find("ToolbarName=\"Vasmora Screenshot\""), std::string::npos);
     EXPECT_EQ(shown, Path("help\\" + topic));
     EXPECT_EQ(ReadFile(Path("help\\" + chosen.DefaultFileName() + "_20260102.htm")), "old");
-    ASSERT_GE(boxes->shown.size(), 2U);
-    EXPECT_EQ(boxes->shown[boxes->shown.size() - 2].text,
+    ASSERT_FALSE(boxes->shown.empty());
+    EXPECT_EQ(boxes->shown.front().text,
               "Please open your browser to :\r\n" + environment->files->ToNative(shown));
     EXPECT_EQ(boxes->shown.back().text, "HTML help workshop is not installed.");
 
