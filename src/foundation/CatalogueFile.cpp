@@ -11,6 +11,8 @@
 #include "platform/text/Text.h"
 #include "platform/xml/XmlDocument.h"
 
+#include <algorithm>
+
 /// Reading and writing the catalogue's file.
 namespace tovimar {
 namespace {
@@ -47,7 +49,10 @@ std::string EitherAttribute(const XmlNode& element, const char* lower, const cha
 /// An identifier is written as it is, so one that holds a mark of the file's form would break the file.
 std::string IdentifierOf(const XmlNode& element, const char* name) {
     std::string identifier = element.attribute(name);
-    if (identifier.find_first_of("\"<&\r\n\t") != std::string::npos)
+    const auto breaksTheFile = [](char byte) {
+        return static_cast<unsigned char>(byte) < ' ' || byte == '"' || byte == '<' || byte == '&';
+    };
+    if (std::any_of(identifier.begin(), identifier.end(), breaksTheFile))
         identifier.clear();
     return identifier;
 }

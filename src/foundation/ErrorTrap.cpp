@@ -141,9 +141,13 @@ ResultCode Trapped(const char* className, const char* operationName, const std::
     }
 }
 
-void LeaveIfInterrupted() {
+bool StopRequested() {
     platform::Env().doEvents();
-    if (Session::Run().generationInterrupted)
+    return Session::Run().generationInterrupted;
+}
+
+void LeaveIfInterrupted() {
+    if (StopRequested())
         throw RaisedError(kGeneralFailure, "The run was stopped.");
 }
 

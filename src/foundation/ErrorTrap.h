@@ -27,6 +27,8 @@ ResultCode Trapped(const char* className, const char* operationName, const std::
 /// The same; `detail` is only asked when the operation fails.
 ResultCode Trapped(const char* className, const char* operationName, const std::function<void()>& operation,
                    const std::function<std::string()>& detail);
+/// Lets Ctrl+C be seen; true when the run was stopped.
+bool StopRequested();
 /// For loops over objects: lets Ctrl+C be seen, and ends the operation in which it stands when the run was
 /// stopped. The trap around it tells nobody of it.
 void LeaveIfInterrupted();

@@ -44,12 +44,22 @@ std::string_view CandidateAt(std::string_view text, std::size_t position) {
     return end == std::string_view::npos ? std::string_view() : near.substr(0, end + 1);
 }
 
+/// Zero, halves of surrogate pairs and the like name no character, and no reader of XML takes them.
+bool IsCharacter(std::uint32_t number) {
+    return number != 0 && number <= 0x10FFFF && (number < 0xD800 || number > 0xDFFF) && number != 0xFFFE &&
+           number != 0xFFFF;
+}
+
 /// "&#39;" and the like, 1 to 7 digits.
 bool IsNumericReference(std::string_view candidate) {
     if (!candidate.starts_with("&#") || !IsIn(static_cast<int>(candidate.size()), 4, 10))
         return false;
     const auto digits = candidate.substr(2, candidate.size() - 3);
-    return std::all_of(digits.begin(), digits.end(), [](char digit) { return digit >= '0' && digit <= '9'; });
+    if (!std::all_of(digits.begin(), digits.end(), [](char digit) { return digit >= '0' && digit <= '9'; }))
+        return false;
+    std::uint32_t number = 0;
+    std::from_chars(digits.data(), digits.data() + digits.size(), number);
+    return IsCharacter(number);
 }
 
 /// What the two encoders do differently.
@@ -147,8 +157,7 @@ char32_t NumberedCharacter(std::string_view candidate) {
         const char byte = static_cast<char>(number);
         return text::ToCodePoints(text::AnsiCodePage().Decode(std::string_view(&byte, 1))).front();
     }
-    const bool valid = number <= 0x10FFFF && (number < 0xD800 || number > 0xDFFF);
-    return valid ? number : 0;
+    return number;
 }
 
 /// One pass: every entity that `characterOf` knows becomes its character.

@@ -150,6 +150,8 @@ ResultCode CHelpPrjTree::BuildXmlNodes(LoadRun& run, std::int32_t level, const X
     if (node == nullptr)
         return kSuccess;
     if (run.loadControls && IsObjectTag(node->Tag)) {
+        if (StopRequested())
+            return kGeneralFailure;
         auto& clock = *platform::Env().clock;
         const auto start = clock.Timer();
         auto controlLevel = level;

@@ -101,7 +101,7 @@ void CHelpPrjTreeNode::ExpandSerializerNodes4CurrentProject(CHelpPrjTree& robjTr
     const auto together = ReadTogether(fragments);
     const auto& document = together.first;
     const auto& elements = together.second;
-    for (std::size_t i = 0; i < fragments.Count(); ++i)
+    for (std::size_t i = 0; i < fragments.Count() && !StopRequested(); ++i)
         // One object that doesn't come through must not cost the others.
         Trapped("CHelpPrjTreeNode", "ExpandSerializerNodes4CurrentProject", [&] {
             const auto& fragment = fragments.At(i + 1);

@@ -64,6 +64,8 @@ TEST_F(TextEncodingsTest, EntitiesAreNotEncodedAgain) {
     EXPECT_EQ(EncodeSpecialChars("&nbsp;&#38;&"), "&nbsp;&#38;&#38;");
     EXPECT_EQ(EncodeXmlText("&nbsp;&amp;&bogus;&"), "&#160;&#38;&#38;bogus;&#38;");
     EXPECT_EQ(EncodeSpecialChars("&bogus;"), "&#38;bogus&#59;");
+    for (const std::string number : {"00", "55296", "65535", "1114112"})
+        EXPECT_EQ(EncodeSpecialChars("&#" + number + ";").substr(0, 5), "&#38;") << number;
     EXPECT_EQ(EncodeXmlText("&Auml;&auml;&AUML;"), "&#196;&#228;&#196;");
     EXPECT_EQ(EncodeXmlText("& far away ;"), "&#38; far away ;");
     const std::string odd = "It's <b> \"5/6\" - a\\b & c;";

@@ -75,8 +75,10 @@ const KeyedList<std::string>& AccObjectsList::XmlCollection(CHelpPrjTree& robjTr
                                                             const IHelpPrjSourceProject& rprj) {
     Trapped(kind_.className, "IXmlSerializer_XmlCollection", [&] {
         given_.clear();
-        for (const auto& item : (rprj.*kind_.items)())
+        for (const auto& item : (rprj.*kind_.items)()) {
+            LeaveIfInterrupted();
             fragments_.Add(Fragment(robjTree, *item));
+        }
     });
     return fragments_;
 }

@@ -90,6 +90,7 @@ void HostSourceProject::ReadPass(CTovimarServerAgent& agent, const Pass& pass) {
     agent.ProgressMeterInit(pass.loading, maximum_);
     Uses uses;
     for (const std::string& name : pass.names) {
+        LeaveIfInterrupted();
         agent.ProgressMeterInit(pass.processing + name + pass.behindName, maximum_);
         agent.ProgressMeterUpdate(++position_);
         const bool own = pass.readsDesign || !IsPassedOver(agent, name);
