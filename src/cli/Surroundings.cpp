@@ -58,13 +58,13 @@ bool IsInstallation(const fs::path& folder) {
     return fs::exists(folder / "Settings", ignored) && fs::exists(folder / "Templates", ignored);
 }
 
-/// TOVIMAR_INSTALL, beside the program, in the source tree around a build, then where packages put it. A
-/// named place counts whatever it holds, so that a wrong one is told.
+/// TOVIMAR_INSTALL, beside the program, in the prefix that it is installed in, in the source tree around a
+/// build, then where packages put it. A named place counts whatever it holds, so that a wrong one is told.
 fs::path FindInstallation(const fs::path& program) {
     if (const char* named = std::getenv("TOVIMAR_INSTALL"); named != nullptr && *named != '\0')
         return fs::absolute(named);
-    for (const fs::path& folder : {program / "install", program / "../install", program / "../../install",
-                                   program / "../share/tovimar", fs::path("/usr/share/tovimar")})
+    for (const fs::path& folder : {program / "install", program / "../share/tovimar", program / "../install",
+                                   program / "../../install", fs::path("/usr/share/tovimar")})
         if (IsInstallation(folder))
             return fs::weakly_canonical(folder);
     return {};

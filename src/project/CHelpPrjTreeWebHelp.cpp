@@ -41,8 +41,10 @@ void CopyCommonFiles(const std::string& folder) {
 std::string SearchEngine() {
     auto& env = platform::Env();
     const auto installation = InstallationFolder();
+    const auto program = platform::WithTrailingBackslash(env.folders.program);
+    // The last is a package's place for it.
     for (const auto& path :
-         {installation + "ss.exe", platform::WithTrailingBackslash(env.folders.program) + "tools\\ss.exe"})
+         {installation + "ss.exe", program + "tools\\ss.exe", program + "..\\lib\\tovimar\\ss.exe"})
         if (env.files->FileExists(path))
             return path;
     throw RaisedError(kNoSearchEngine, "Site search engine (ss.exe) not found in '" + installation + "'.",

@@ -1,0 +1,13 @@
+# Version and date stand in one place, the header that the program shows them from.
+set(header ${CMAKE_CURRENT_LIST_DIR}/../src/foundation/Product.h)
+set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${header})
+file(READ ${header} text)
+foreach(name kMajorVersion kMinorVersion kRevision kBuildDate kSupportAddress)
+  if(NOT text MATCHES "${name} = \"?([^\";]+)\"?;")
+    message(FATAL_ERROR "${name} isn't found in ${header}")
+  endif()
+  set(${name} ${CMAKE_MATCH_1})
+endforeach()
+set(TOVIMAR_VERSION ${kMajorVersion}.${kMinorVersion}${kRevision})
+set(TOVIMAR_DATE ${kBuildDate})
+set(TOVIMAR_SUPPORT ${kSupportAddress})
