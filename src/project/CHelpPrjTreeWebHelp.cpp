@@ -3,6 +3,7 @@
 #include "foundation/Paths.h"
 #include "foundation/Session.h"
 #include "generation/CTovimarParameters.h"
+#include "generation/FolderOperations.h"
 #include "generation/HelpUtilities.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
@@ -22,20 +23,12 @@ namespace {
 constexpr ResultCode kNoSearchEngine = 30001;
 constexpr std::int32_t kOptionIndent = 8;
 
-void CopyAll(const std::string& from, const std::string& pattern, const std::string& to) {
-    auto& files = *platform::Env().files;
-    if (!files.FolderExists(from))
-        return;
-    for (const auto& name : files.ListFiles(from, pattern))
-        files.CopyFile(platform::Join(from, name), platform::Join(to, name));
-}
-
 void CopyCommonFiles(const std::string& folder) {
     const auto images = platform::Join(folder, "images\\");
     platform::Env().files->MakeFolders(images);
-    CopyAll(CommonTemplatesFolder() + "images\\", "*.*", images);
+    CopyFilesByMask(CommonTemplatesFolder() + "images\\", images, "*.*");
     for (const char* pattern : {"*.js", "*.css"})
-        CopyAll(CommonTemplatesFolder(), pattern, folder);
+        CopyFilesByMask(CommonTemplatesFolder(), folder, pattern);
 }
 
 std::string SearchEngine() {
