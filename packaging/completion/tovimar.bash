@@ -18,7 +18,7 @@ _tovimar_words() {
 
 # Names of the catalogue; they may hold blanks.
 _tovimar_projects() {
-    "$_tovimar_program" projects 2>/dev/null | sed -nE '/^[^ ]/ s/  ".*//p'
+    "$_tovimar_program" projects 2>/dev/null | sed -n '/^[^ ]/ { s/  ".*//; p }'
 }
 
 _tovimar_option_names() {
@@ -34,9 +34,9 @@ _tovimar_option_values() {
 
 # _tovimar_offer TYPED: the lines of standard input that begin so, quoted where the shell needs it.
 _tovimar_offer() {
-    local line
+    local line typed=${1//\\/}
     while IFS= read -r line; do
-        [[ -n $line && $line == "$1"* ]] && COMPREPLY+=("$(printf %q "$line")")
+        [[ -n $line && $line == "$typed"* ]] && COMPREPLY+=("$(printf %q "$line")")
     done
 }
 
