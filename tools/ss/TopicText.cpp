@@ -61,7 +61,8 @@ std::string Attribute(std::string_view tag, std::string_view name) {
         const char quote = value < tag.size() ? tag[value] : ' ';
         const bool quoted = quote == '"' || quote == '\'';
         const auto start = quoted ? value + 1 : value;
-        const auto end = quoted ? tag.find(quote, start) : std::min(tag.find_first_of(" \t\r\n", start), tag.size());
+        const auto end =
+            quoted ? tag.find(quote, start) : std::min(tag.find_first_of(" \t\r\n", start), tag.size());
         return end == kNone ? std::string() : Plain(tag.substr(start, end - start));
     }
     return {};
