@@ -21,6 +21,9 @@ namespace {
 /// A page: the program waits for its reader early on.
 constexpr int kPipeSize = 4096;
 
+/// A program that asks what no test answers ends, and the test fails instead of waiting for ever.
+constexpr unsigned kLongestRunSeconds = 300;
+
 int OpenForWriting(const fs::path& file) {
     return open(file.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0600);
 }
@@ -134,6 +137,7 @@ void ProgramTest::BecomeProgram(const std::vector<std::string>& arguments) const
     for (const std::string& argument : arguments)
         pointers.push_back(const_cast<char*>(argument.c_str()));
     pointers.push_back(nullptr);
+    alarm(kLongestRunSeconds);
     if (chdir(folder_.c_str()) == 0)
         execv(pointers[0], pointers.data());
     _exit(127);
