@@ -15,7 +15,7 @@
 
   var tell = function (message) { parent.postMessage(message, "*"); };
   var shown = function () { tell({ tovimar: "page", href: location.href, title: document.title }); };
-  document.addEventListener("DOMContentLoaded", shown);
+  document.addEventListener("DOMContentLoaded", function () { wrapPictures(); shown(); });
   addEventListener("hashchange", shown);
   addEventListener("pageshow", function (event) { if (event.persisted) shown(); });
   addEventListener("message", function (event) {
@@ -29,6 +29,17 @@
     tell({ tovimar: "key", key: key });
     if (key === "/") event.preventDefault();
   });
+
+  // Pictures between the paragraphs of a control, too, scroll by themselves where the screen is narrow.
+  function wrapPictures() {
+    document.querySelectorAll("img[usemap]").forEach(function (picture) {
+      if (picture.closest(".picture")) return;
+      var box = document.createElement("div");
+      box.className = "picture";
+      picture.replaceWith(box);
+      box.append(picture);
+    });
+  }
 
   // As the search page folds words.
   var plain = { "ß": "ss", "æ": "ae", "œ": "oe", "ø": "o", "ł": "l", "đ": "d", "ð": "d", "ħ": "h", "ı": "i", "þ": "th", "ς": "σ" };
