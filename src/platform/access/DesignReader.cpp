@@ -106,7 +106,11 @@ void ReadMacroDesign(Design& design, ExportTree& tree) {
 
 std::unique_ptr<Design> ReadDesign(std::string_view source, ObjectKind kind, const std::string& name,
                                    const std::string& nativePath) {
-    auto tree = ParseExportTree(source, nativePath);
+    return DesignOfTree(ParseExportTree(source, nativePath), kind, name, nativePath);
+}
+
+std::unique_ptr<Design> DesignOfTree(ExportTree tree, ObjectKind kind, const std::string& name,
+                                     const std::string& nativePath) {
     auto design = std::make_unique<Design>();
     design->kind = kind;
     design->name = name;

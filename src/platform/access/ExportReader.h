@@ -36,6 +36,10 @@ ExportTree ParseExportTree(std::string_view text, const std::string& nativePath)
 std::unique_ptr<Design> ReadDesign(std::string_view text, ObjectKind kind, const std::string& name,
                                    const std::string& nativePath);
 
+/// The design of what ParseExportTree gave, or of blocks that were read from a database.
+std::unique_ptr<Design> DesignOfTree(ExportTree tree, ObjectKind kind, const std::string& name,
+                                     const std::string& nativePath);
+
 /// Module source as the host's editor counts its lines: without the class header and "Attribute" lines.
 std::string VisibleCode(std::string_view code);
 

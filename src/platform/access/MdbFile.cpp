@@ -133,6 +133,46 @@ void MdbTable::ForEachRow(const std::function<bool(const std::vector<std::string
     }
 }
 
+std::string MdbTable::LongValue(unsigned int column, std::size_t most) const {
+    auto* source = ColumnAt(table_, column);
+    auto* mdb = table_->entry->mdb;
+    std::string place(static_cast<const char*>(source->bind_ptr), MDB_MEMO_OVERHEAD);
+    std::string value;
+    auto length = mdb_ole_read(mdb, source, place.data(), MDB_BIND_SIZE);
+    while (length > 0 && value.size() < most) {
+        value.append(static_cast<const char*>(source->bind_ptr), length);
+        length = mdb_ole_read_next(mdb, source, place.data());
+    }
+    return value;
+}
+
+void MdbTable::ForEachRawRow(std::size_t most,
+                             const std::function<bool(const std::vector<std::string>& cells)>& row) {
+    const auto count = table_->num_cols;
+    std::vector<std::string> buffers(count, std::string(kMaxCell + 1, '\0'));
+    for (unsigned int i = 0; i < count; ++i)
+        mdb_bind_column(table_, static_cast<int>(i) + 1, buffers[i].data(), nullptr);
+    mdb_rewind_table(table_);
+    const auto* mdb = table_->entry->mdb;
+    std::vector<std::string> cells(count);
+    while (mdb_fetch_row(table_)) {
+        // Reading a long value takes the page from under the other cells: they come first.
+        for (unsigned int i = 0; i < count; ++i) {
+            const auto* column = ColumnAt(table_, i);
+            const auto start = static_cast<std::size_t>(column->cur_value_start);
+            const auto length = static_cast<std::size_t>(column->cur_value_len);
+            const bool inside = start <= sizeof mdb->pg_buf && length <= sizeof mdb->pg_buf - start;
+            cells[i] = inside ? std::string(reinterpret_cast<const char*>(mdb->pg_buf) + start, length)
+                              : std::string();
+        }
+        for (unsigned int i = 0; i < count; ++i)
+            if (const auto type = ColumnAt(table_, i)->col_type; type == MDB_OLE || type == MDB_MEMO)
+                cells[i] = cells[i].empty() ? std::string() : LongValue(i, most);
+        if (!row(cells))
+            return;
+    }
+}
+
 struct MdbFile::Handle {
     MdbHandle* mdb = nullptr;
 };

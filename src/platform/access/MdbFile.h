@@ -28,11 +28,16 @@ public:
     TableDefinition Definition() const;
     /// Calls `row` with the cells' texts, in the order of the columns, until it answers false.
     void ForEachRow(const std::function<bool(const std::vector<std::string>& cells)>& row);
+    /// The same with the bytes as they are kept: numbers in their own form, long values whole, but for what
+    /// is behind `most` bytes of a cell.
+    void ForEachRawRow(std::size_t most,
+                       const std::function<bool(const std::vector<std::string>& cells)>& row);
     std::vector<std::string> ColumnNames() const;
 
 private:
     friend class MdbFile;
     explicit MdbTable(MdbTableDef* table);
+    std::string LongValue(unsigned int column, std::size_t most) const;
     MdbTableDef* table_; ///< owned
 };
 
