@@ -3,7 +3,9 @@
 #include "platform/Environment.h"
 #include "platform/Error.h"
 #include "platform/access/ExportReader.h"
+#include "platform/access/ExportTreeText.h"
 #include "platform/access/TableReader.h"
+#include "platform/access/database/DatabaseDesigns.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
@@ -148,17 +150,13 @@ void ApplicationModel::Load(ObjectKind kind, Object& object) {
     if (object.loaded)
         return;
     object.loaded = true;
-    if (object.path.empty()) {
-        object.error = object.database + ": of the " + KindWord(kind) + " " + object.name +
-                       " only the name is known, its design isn't.";
-        return;
-    }
     try {
-        const std::string exported = ReadText(object.path);
-        object.design = ReadDesign(exported, kind, object.name, Native(object.path));
+        auto tree = TreeOf(kind, object, object.length);
+        const auto source = object.path.empty() ? object.database : Native(object.path);
+        object.design = DesignOfTree(std::move(tree), kind, object.name, source);
         if (!object.codePath.empty())
             object.design->code = ReadText(object.codePath);
-        object.length = exported.size() + object.design->code.size();
+        object.length += object.design->code.size();
         readLength_ += object.length;
         readDesigns_.push_back(&object);
         if (!object.stowed.empty())
@@ -166,6 +164,25 @@ void ApplicationModel::Load(ObjectKind kind, Object& object) {
     } catch (const RaisedError& failure) {
         object.error = failure.what();
     }
+}
+
+ExportTree ApplicationModel::TreeOf(ObjectKind kind, const Object& object, std::size_t& length) {
+    if (object.path.empty()) {
+        auto& designs = DesignsOf(object);
+        // Texts are kept in two bytes a character; everything else is as long as in an export.
+        length = designs.Blob(kind, object.name).size();
+        return designs.Tree(kind, object.name);
+    }
+    const std::string exported = ReadText(object.path);
+    length = exported.size();
+    return ParseExportTree(exported, Native(object.path));
+}
+
+DatabaseDesigns& ApplicationModel::DesignsOf(const Object& object) {
+    auto& designs = databaseDesigns_[object.database];
+    if (designs == nullptr)
+        designs = std::make_unique<DatabaseDesigns>(object.database);
+    return *designs;
 }
 
 void ApplicationModel::TrimDesigns() {
@@ -212,7 +229,7 @@ std::string ApplicationModel::DesignError(ObjectKind kind, const std::string& na
 bool ApplicationModel::DesignKnown(ObjectKind kind, const std::string& name) const {
     auto& self = const_cast<ApplicationModel&>(*this);
     const auto* object = self.ListOf(kind).Find(name);
-    return object && !(*object)->path.empty();
+    return object && (!(*object)->path.empty() || self.DesignsOf(**object).Has(kind, name));
 }
 
 NamedTexts ApplicationModel::DocumentProperties(ObjectKind kind, const std::string& name) const {
@@ -227,7 +244,11 @@ const Design* ApplicationModel::FindDesign(ObjectKind kind, const std::string& n
 std::string ApplicationModel::ExportText(ObjectKind kind, const std::string& name) {
     OpenDesign(kind, name);
     const auto& object = Demand(kind, name);
-    auto exported = ReadText(object.path);
+    std::size_t length = 0;
+    auto exported =
+        object.path.empty() ? ExportTreeText(*TreeOf(kind, object, length).root) : ReadText(object.path);
+    if (object.path.empty() && !object.design->code.empty())
+        exported += "CodeBehindForm\r\n" + object.design->code;
     if (!object.codePath.empty())
         exported += "CodeBehindForm\r\n" + object.design->code;
     return exported;
@@ -246,8 +267,10 @@ SavedObject ApplicationModel::ChangesOf(const Design& design) const {
 
 std::optional<std::string> ApplicationModel::ModuleCode(const std::string& name) {
     const auto* object = modules_.Find(name);
-    if (!object || (*object)->path.empty())
+    if (!object)
         return std::nullopt;
+    if ((*object)->path.empty())
+        return DesignsOf(**object).ModuleCode((*object)->name);
     return ReadText((*object)->path);
 }
 

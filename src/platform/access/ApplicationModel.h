@@ -5,6 +5,7 @@
 #include "platform/access/AccessApplication.h"
 #include "platform/access/ApplicationFolder.h"
 #include "platform/access/DatabaseReader.h"
+#include "platform/access/ExportReader.h"
 #include "platform/access/OpenObject.h"
 #include "platform/access/QueryReader.h"
 
@@ -16,6 +17,8 @@
 #include <vector>
 
 namespace tovimar::platform::access {
+
+class DatabaseDesigns;
 
 /// One application as its sources give it, whatever they are. Everything is read once: names at the start,
 /// designs, definitions and records when they are first asked for.
@@ -128,6 +131,10 @@ private:
     Objects& ListOf(ObjectKind kind);
     Object& Demand(ObjectKind kind, const std::string& name);
     void Load(ObjectKind kind, Object& object);
+    /// What a design is read from, and how long that is.
+    ExportTree TreeOf(ObjectKind kind, const Object& object, std::size_t& length);
+    /// Of the database that an object without an export lies in.
+    DatabaseDesigns& DesignsOf(const Object& object);
     void StowWrittenValues(Object& object);
     void RestoreWrittenValues(Object& object);
     Table& TableNamed(const std::string& name);
@@ -152,6 +159,7 @@ private:
     Objects forms_, reports_, macros_, modules_;
     std::deque<Object*> readDesigns_; ///< in the order of reading
     std::size_t readLength_ = 0;
+    std::map<std::string, std::unique_ptr<DatabaseDesigns>> databaseDesigns_; ///< by native path
     KeyedList<std::unique_ptr<Table>> tables_;
     KeyedList<std::unique_ptr<Query>> queries_;
     std::vector<RelationDefinition> relations_;

@@ -53,23 +53,23 @@ PropertyValue Number(std::int64_t number) {
 PropertyValue ValueOf(const DesignRecord& record) {
     const auto& bytes = record.bytes;
     switch (record.type) {
-    case RecordType::Flag:
+    case ValueKind::Flag:
         if (bytes.empty() && record.slot < kFirstLateSlot)
             return {Form::NotDefault, {}};
         return Number(bytes.empty() ? 0 : static_cast<std::uint8_t>(bytes[0]));
-    case RecordType::Byte:
+    case ValueKind::Byte:
         return Number(bytes.empty() ? 0 : static_cast<std::uint8_t>(bytes[0]));
-    case RecordType::Integer:
-    case RecordType::Long:
+    case ValueKind::Integer:
+    case ValueKind::Long:
         if (bytes.size() <= 4)
             return Number(SignedNumber(bytes));
         break;
-    case RecordType::Float:
+    case ValueKind::Float:
         if (bytes.size() == 4)
             return {Form::Number, FloatText(bytes)};
         break;
-    case RecordType::Text:
-    case RecordType::LongText:
+    case ValueKind::Text:
+    case ValueKind::LongText:
         return {Form::Text, FromUtf16Bytes(bytes)};
     default:
         break;
@@ -112,7 +112,7 @@ std::unique_ptr<DesignObject> Convert(const BlobObject& source) {
     for (const auto& record : source.records) {
         if (IsNoPicture(record))
             continue;
-        if (record.type == RecordType::Macro)
+        if (record.type == ValueKind::Macro)
             AddMacro(*object, record);
         else if (auto value = ValueOf(record); value.form != Form::Bytes || !value.text.empty())
             object->properties.emplace_back(NameOf(record), std::move(value));

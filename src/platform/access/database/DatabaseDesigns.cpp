@@ -55,6 +55,14 @@ std::vector<std::string> DatabaseDesigns::Names(ObjectKind kind) {
     return names;
 }
 
+bool DatabaseDesigns::Has(ObjectKind kind, const std::string& name) {
+    try {
+        return kind == ObjectKind::Module ? ModuleCode(name).has_value() : !Blob(kind, name).empty();
+    } catch (const RaisedError&) {
+        return false; // opening the object tells why
+    }
+}
+
 const StorageNode* DatabaseDesigns::Folder(ObjectKind kind, const std::string& name) {
     Kept();
     const auto& folders = folders_[kind];

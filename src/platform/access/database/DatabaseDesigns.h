@@ -24,6 +24,8 @@ public:
     /// Names of the forms, reports, macros or modules that are kept here, in the order of the storage;
     /// leftovers of the clipboard are passed over. Raises as ReadStorage.
     std::vector<std::string> Names(ObjectKind kind);
+    /// Whether a design of that name is there; false, too, for a database whose storage can't be read.
+    bool Has(ObjectKind kind, const std::string& name);
     /// Raises 0x80040001 "<path>, <kind> <name>: <reason>" for a design that is missing or damaged, and for
     /// the databases of 1997 and older, whose designs can't be read.
     ExportTree Tree(ObjectKind kind, const std::string& name);
@@ -38,7 +40,6 @@ public:
     const std::string& NativePath() const { return nativePath_; }
 
 private:
-    struct Containers;
     const Storage& Kept();
     const StorageNode* Folder(ObjectKind kind, const std::string& name);
     std::string_view Stream(ObjectKind kind, const std::string& name, std::string_view stream);

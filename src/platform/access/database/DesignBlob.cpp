@@ -55,7 +55,7 @@ DesignRecord ReadRecord(ByteReader& reader, std::uint32_t slot) {
     DesignRecord record;
     record.slot = slot;
     record.code = reader.U16();
-    record.type = static_cast<RecordType>(reader.U32() & 0xFFFFU);
+    record.type = static_cast<ValueKind>(reader.U32() & 0xFFFFU);
     reader.Skip(4); // a width that says no more than the length
     const auto length = reader.U32();
     record.bytes = reader.Take(length);
@@ -68,15 +68,15 @@ DesignRecord ReadCompactRecord(ByteReader& reader, std::uint32_t slot, std::uint
     record.slot = slot;
     record.code = CodeOfSlot(objectType, slot);
     if (slot < 48) {
-        record.type = RecordType::Flag;
+        record.type = ValueKind::Flag;
     } else if (slot < 96) {
-        record.type = RecordType::Byte;
+        record.type = ValueKind::Byte;
         record.bytes = reader.Take(1);
     } else if (slot < 156) {
-        record.type = RecordType::Integer;
+        record.type = ValueKind::Integer;
         record.bytes = reader.Take(2);
     } else if (slot < 188) {
-        record.type = RecordType::Long;
+        record.type = ValueKind::Long;
         record.bytes = reader.Take(4);
     } else {
         record.type = TypeOfCode(record.code);
@@ -127,9 +127,9 @@ bool HasNewerCodes(BlobObject& root) {
     int older = 0;
     int newer = 0;
     ForEachRecord(root, [&](const DesignRecord& record) {
-        if (record.type == RecordType::Long && record.code == kGridlineColor)
+        if (record.type == ValueKind::Long && record.code == kGridlineColor)
             ++older;
-        if (record.type == RecordType::Long && record.code == kGridlineColor + 1)
+        if (record.type == ValueKind::Long && record.code == kGridlineColor + 1)
             ++newer;
         older += record.code == kLayoutCachedLeft ? 1 : 0;
         newer += record.code == kBehindLayoutCachedHeight ? 1 : 0;

@@ -12,7 +12,7 @@
 namespace tovimar::platform::access {
 
 /// What a record's value is; the numbers are the file's.
-enum class RecordType : std::uint16_t {
+enum class ValueKind : std::uint16_t {
     Flag = 1, ///< without bytes in the slots below 48: not the default
     Byte = 2,
     Integer = 3,
@@ -31,7 +31,7 @@ enum class RecordType : std::uint16_t {
 struct DesignRecord {
     std::uint32_t slot = 0;
     std::uint16_t code = 0;
-    RecordType type = RecordType::Flag;
+    ValueKind type = ValueKind::Flag;
     std::string_view bytes; ///< within the blob
 };
 

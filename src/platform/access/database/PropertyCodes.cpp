@@ -334,21 +334,21 @@ std::string PropertyName(std::uint16_t code) {
     return property ? std::string(property->name) : "Unknown" + std::to_string(code);
 }
 
-RecordType TypeOfCode(std::uint16_t code) {
+ValueKind TypeOfCode(std::uint16_t code) {
     const auto* property = FindProperty(code);
     switch (property ? property->type : '-') {
     case 't':
-        return RecordType::Text;
+        return ValueKind::Text;
     case 'm':
-        return RecordType::LongText;
+        return ValueKind::LongText;
     case 'g':
-        return RecordType::Guid;
+        return ValueKind::Guid;
     case 'd':
-        return RecordType::Double;
+        return ValueKind::Double;
     case 'k':
-        return RecordType::Macro;
+        return ValueKind::Macro;
     default:
-        return RecordType::Binary;
+        return ValueKind::Binary;
     }
 }
 

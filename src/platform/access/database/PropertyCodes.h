@@ -20,7 +20,7 @@ std::uint16_t ObjectTypeNumber(std::string_view name);
 std::string PropertyName(std::uint16_t code);
 bool IsKnownProperty(std::uint16_t code);
 /// How a property's value is kept; binary where it isn't known.
-RecordType TypeOfCode(std::uint16_t code);
+ValueKind TypeOfCode(std::uint16_t code);
 /// The code of a slot below 253, for designs that keep no codes; kUnknownCode for an unknown one.
 std::uint16_t CodeOfSlot(std::uint16_t objectType, std::uint32_t slot);
 
