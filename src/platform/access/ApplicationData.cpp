@@ -7,6 +7,7 @@
 #include "platform/access/QueryRunner.h"
 #include "platform/access/TableReader.h"
 #include "platform/access/ThemeReader.h"
+#include "platform/access/database/DatabaseDesigns.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
@@ -242,14 +243,29 @@ Records ApplicationModel::QueryRecords(const QueryDefinition& query,
 
 std::string ApplicationModel::FindPicture(const std::string& name) {
     const auto* path = pictures_.Find(name);
-    return path && Env().files->FileExists(*path) ? Env().files->ReadFile(*path) : std::string();
+    if (path && Env().files->FileExists(*path))
+        return Env().files->ReadFile(*path);
+    return FromDesigns([&](DatabaseDesigns& designs) { return designs.Picture(name); });
+}
+
+/// The first answer of the databases that lie at hand; one that can't be read has none.
+std::string ApplicationModel::FromDesigns(const std::function<std::string(DatabaseDesigns&)>& ask) {
+    for (auto& [path, designs] : databaseDesigns_) {
+        try {
+            if (auto answer = ask(*designs); !answer.empty())
+                return answer;
+        } catch (const RaisedError&) {
+            continue;
+        }
+    }
+    return {};
 }
 
 /// Bytes of the theme that the database's properties name; empty where the source has none.
 std::string ApplicationModel::ThemeFile() {
     const auto properties = folder_ + "\\dbs-properties.json";
     if (!Env().files->FileExists(properties))
-        return {};
+        return FromDesigns([](DatabaseDesigns& designs) { return designs.Theme(); });
     const auto name = JsonText(ReadText(properties), Env().files->ToNative(properties),
                                {"Items", "Theme Resource Name", "Value"});
     const auto path = folder_ + "\\themes\\" + name + ".thmx";

@@ -179,10 +179,7 @@ ExportTree ApplicationModel::TreeOf(ObjectKind kind, const Object& object, std::
 }
 
 DatabaseDesigns& ApplicationModel::DesignsOf(const Object& object) {
-    auto& designs = databaseDesigns_[object.database];
-    if (designs == nullptr)
-        designs = std::make_unique<DatabaseDesigns>(object.database);
-    return *designs;
+    return *databaseDesigns_.at(object.database);
 }
 
 void ApplicationModel::TrimDesigns() {

@@ -10,6 +10,7 @@
 #include "platform/access/QueryReader.h"
 
 #include <deque>
+#include <functional>
 #include <map>
 #include <memory>
 #include <string>
@@ -147,6 +148,7 @@ private:
     const Records* KnownRecords(const std::string& source, int rows, int depth);
     Records TableRecords(Table& table);
     std::string ThemeFile();
+    std::string FromDesigns(const std::function<std::string(DatabaseDesigns&)>& ask);
     Records QueryRecords(const QueryDefinition& query, const std::vector<FieldDefinition>& fields, int rows,
                          int depth);
 

@@ -3,6 +3,7 @@
 #include "platform/access/ApplicationModel.h"
 #include "platform/access/ExportReader.h"
 #include "platform/access/TableReader.h"
+#include "platform/access/database/DatabaseDesigns.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
@@ -201,6 +202,7 @@ void ApplicationModel::TakeDatabase(const std::string& path, bool topLevel) {
     }
     if (!topLevel)
         return;
+    databaseDesigns_.emplace(nativePath, std::make_unique<DatabaseDesigns>(nativePath));
     for (auto& query : content.queries) {
         if (kindInExports_[IndexOf(ObjectKind::Query)] || queries_.Contains(query.name))
             continue;

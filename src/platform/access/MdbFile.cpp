@@ -197,6 +197,16 @@ MdbFile::~MdbFile() {
     mdb_close(handle_->mdb);
 }
 
+std::vector<std::string> MdbFile::TableNames() const {
+    std::vector<std::string> names;
+    for (guint i = 0; i < handle_->mdb->catalog->len; ++i) {
+        const auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(handle_->mdb->catalog, i));
+        if (entry->object_type == MDB_TABLE)
+            names.push_back(text::MakeValidUtf8(entry->object_name));
+    }
+    return names;
+}
+
 std::unique_ptr<MdbTable> MdbFile::OpenTable(const std::string& name) {
     // Names in the catalogue may be cut inside of a character; they are compared as the library gives them.
     auto* catalog = handle_->mdb->catalog;

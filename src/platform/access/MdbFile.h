@@ -49,6 +49,7 @@ public:
     MdbFile(const MdbFile&) = delete;
     MdbFile& operator=(const MdbFile&) = delete;
 
+    std::vector<std::string> TableNames() const;
     /// Null when the table is absent or its definition can't be read.
     std::unique_ptr<MdbTable> OpenTable(const std::string& name);
     /// Properties of the object of that name, "Description" and the like.

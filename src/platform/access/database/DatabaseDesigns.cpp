@@ -3,7 +3,6 @@
 #include "platform/Error.h"
 #include "platform/access/database/BlobTree.h"
 #include "platform/access/database/MacroGrid.h"
-#include "platform/access/database/StorageReader.h"
 #include "platform/text/Text.h"
 
 #include <array>
@@ -23,25 +22,26 @@ const char* KindWord(ObjectKind kind) {
 } // namespace
 
 const Storage& DatabaseDesigns::Kept() {
-    if (storage_)
-        return *storage_;
-    storage_ = ReadStorage(nativePath_);
+    if (stored_)
+        return stored_->tree;
+    stored_ = ReadStorage(nativePath_);
+    const auto& tree = stored_->tree;
     for (const auto& [kind, container] : kContainers) {
-        const auto* folder = storage_->Find({container});
-        const auto* names = folder != nullptr ? storage_->Child(*folder, "\x03"
-                                                                         "DirData")
+        const auto* folder = tree.Find({container});
+        const auto* names = folder != nullptr ? tree.Child(*folder, "\x03"
+                                                                    "DirData")
                                               : nullptr;
         if (names == nullptr)
             continue;
         for (const auto& [name, number] : ReadFolderNames(names->bytes)) {
-            const auto* object = storage_->Child(*folder, std::to_string(number));
+            const auto* object = tree.Child(*folder, std::to_string(number));
             if (object == nullptr || name.starts_with("~TMPCLP"))
                 continue;
             if (folders_[kind].emplace(text::FoldCase(name), object).second)
                 names_[kind].push_back(name);
         }
     }
-    return *storage_;
+    return tree;
 }
 
 std::vector<std::string> DatabaseDesigns::Names(ObjectKind kind) {
@@ -113,6 +113,23 @@ ExportTree DatabaseDesigns::Tree(ObjectKind kind, const std::string& name) {
     }
     tree.code = ModuleCode((kind == ObjectKind::Form ? "Form_" : "Report_") + name).value_or("");
     return tree;
+}
+
+std::string DatabaseDesigns::Picture(const std::string& name) {
+    Kept();
+    for (const auto& resource : stored_->resources)
+        if (resource.type == "img" && text::EqualsIgnoringCase(resource.name, name))
+            return resource.bytes;
+    return {};
+}
+
+std::string DatabaseDesigns::Theme() {
+    Kept();
+    const StoredResource* theme = nullptr;
+    for (const auto& resource : stored_->resources)
+        if (resource.type == "thmx" && (theme == nullptr || resource.name == stored_->themeName))
+            theme = &resource;
+    return theme != nullptr ? theme->bytes : std::string();
 }
 
 const VbaProject& DatabaseDesigns::Code() {

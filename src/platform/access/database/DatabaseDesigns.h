@@ -4,7 +4,7 @@
 #include "platform/access/ExportReader.h"
 #include "platform/access/database/DesignBlob.h"
 #include "platform/access/database/MemberList.h"
-#include "platform/access/database/Storage.h"
+#include "platform/access/database/StorageReader.h"
 #include "platform/access/database/VbaProject.h"
 
 #include <map>
@@ -37,6 +37,10 @@ public:
     /// Source of the module of that name ("Form_Orders" behind a form); none when there isn't one.
     std::optional<std::string> ModuleCode(const std::string& name);
     const VbaProject& Code();
+    /// The file of a shared picture, empty for an unknown name.
+    std::string Picture(const std::string& name);
+    /// The file of the theme in use, empty for a database without one.
+    std::string Theme();
     const std::string& NativePath() const { return nativePath_; }
 
 private:
@@ -46,7 +50,7 @@ private:
     [[noreturn]] void Fail(ObjectKind kind, const std::string& name, const std::string& reason) const;
 
     std::string nativePath_;
-    std::optional<Storage> storage_;
+    std::optional<StoredDesigns> stored_;
     std::map<ObjectKind, std::map<std::string, const StorageNode*>> folders_; ///< by folded name
     std::map<ObjectKind, std::vector<std::string>> names_;
     std::optional<VbaProject> code_;
