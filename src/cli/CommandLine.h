@@ -26,7 +26,9 @@ struct Arguments {
         SetSetting,
         List,
         Options,
-        ConvertContents
+        ConvertContents,
+        Inspect,
+        ExportTexts
     };
     Command command = Command::None;
     /// The application; of `convert-contents` the contents file. May be empty where a project names it.

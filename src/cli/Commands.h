@@ -19,6 +19,8 @@ int ListSettings(const Arguments& arguments, Surroundings& surroundings);
 int GetSetting(const Arguments& arguments, Surroundings& surroundings);
 int SetSetting(const Arguments& arguments, Surroundings& surroundings);
 int List(const Arguments& arguments);
+int InspectDatabase(const Arguments& arguments, Surroundings& surroundings);
+int ExportTexts(const Arguments& arguments, Surroundings& surroundings);
 int ShowOptions();
 int ConvertContents(const Arguments& arguments, Surroundings& surroundings);
 

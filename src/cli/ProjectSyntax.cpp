@@ -73,6 +73,39 @@ void AddSettings(CLI::App& app, Arguments& parsed) {
     settings->require_subcommand(0, 1);
 }
 
+CLI::Option* AddDatabase(CLI::App& command, Arguments& parsed) {
+    return command.add_option("FILE", parsed.source, "the database file (.accdb, .mdb)")
+        ->required()
+        ->check(CLI::Validator(CLI::ExistingFile).description(""))
+        ->type_name("");
+}
+
+void AddDatabaseCommands(CLI::App& app, Arguments& parsed) {
+    auto* inspect = AddCommand(app, parsed, "inspect",
+                               "show what is read of a database's designs, and what in them doesn't agree",
+                               Command::Inspect, "tovimar inspect shop.accdb Orders --form");
+    AddDatabase(*inspect, parsed);
+    inspect
+        ->add_option("OBJECT", parsed.object,
+                     "a form, report, macro or module; all of them in short when not given")
+        ->type_name("");
+    auto* form = inspect->add_flag_callback(
+        "--form", [&parsed] { parsed.objectKind = Arguments::ObjectKind::Form; }, "forms only");
+    inspect
+        ->add_flag_callback(
+            "--report", [&parsed] { parsed.objectKind = Arguments::ObjectKind::Report; }, "reports only")
+        ->excludes(form);
+    AddJson(*inspect, parsed);
+    auto* texts = AddCommand(app, parsed, "export",
+                             "write a database's forms, reports, macros, modules and queries as texts",
+                             Command::ExportTexts, "tovimar export shop.accdb --output shop-source");
+    AddDatabase(*texts, parsed);
+    texts
+        ->add_option("--output", parsed.output, "folder to write to; files that stay the same aren't touched")
+        ->required()
+        ->type_name("DIR");
+}
+
 } // namespace
 
 void AddProjectSyntax(CLI::App& app, Arguments& parsed) {
@@ -90,6 +123,7 @@ void AddSourceSyntax(CLI::App& app, Arguments& parsed) {
     AddJson(*list, parsed);
     AddCommand(app, parsed, "options", "show the options of a help with their meaning", Command::Options,
                "tovimar options");
+    AddDatabaseCommands(app, parsed);
     auto* convert = AddCommand(app, parsed, "convert-contents",
                                "turn a contents file of another help (.hhc) into a project's contents",
                                Command::ConvertContents, "tovimar convert-contents old.hhc --output old.tvp");

@@ -41,6 +41,10 @@ int RunCommand(const Arguments& arguments, Surroundings& surroundings) {
         return List(arguments);
     case Command::ConvertContents:
         return ConvertContents(arguments, surroundings);
+    case Command::Inspect:
+        return InspectDatabase(arguments, surroundings);
+    case Command::ExportTexts:
+        return ExportTexts(arguments, surroundings);
     default:
         return ShowOptions();
     }

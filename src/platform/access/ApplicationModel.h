@@ -68,6 +68,9 @@ public:
     const std::vector<FieldDefinition>& QueryFields(const std::string& name);
     const std::vector<RelationDefinition>& Relations() const { return relations_; }
 
+    /// Sentences for a person on what the sources don't agree in.
+    const std::vector<std::string>& Notes() const { return notes_; }
+
     const Design* FindDesign(ObjectKind kind, const std::string& name) override;
     const Records* FindRecords(const std::string& recordSource, int rows) override;
     std::string FindPicture(const std::string& name) override;
@@ -126,6 +129,7 @@ private:
     void TakeRelation(const std::string& path);
     void TakeDocuments(const std::string& path);
     void TakeDatabase(const std::string& path, bool topLevel);
+    void NoteDifferences(const DatabaseContent& content, const std::string& nativePath);
     void TakeDatabaseTables(DatabaseContent& content, const std::string& nativePath);
     void SortNames();
 
@@ -169,6 +173,7 @@ private:
     KeyedList<std::string> pictures_;  ///< Windows paths by picture name
     std::vector<std::string> names_[6];
     bool kindInExports_[6] = {};
+    std::vector<std::string> notes_;
     std::unordered_map<std::string, std::unique_ptr<Records>> records_;
     std::unordered_map<const void*, WrittenProperties> written_;
 };

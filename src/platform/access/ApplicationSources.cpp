@@ -202,6 +202,7 @@ void ApplicationModel::TakeDatabase(const std::string& path, bool topLevel) {
     }
     if (!topLevel)
         return;
+    NoteDifferences(content, nativePath);
     databaseDesigns_.emplace(nativePath, std::make_unique<DatabaseDesigns>(nativePath));
     for (auto& query : content.queries) {
         if (kindInExports_[IndexOf(ObjectKind::Query)] || queries_.Contains(query.name))
@@ -219,6 +220,51 @@ void ApplicationModel::TakeDatabase(const std::string& path, bool topLevel) {
         (*objects.Find(name))->name = name;
         (*objects.Find(name))->database = nativePath;
         (*objects.Find(name))->properties = std::move(properties);
+    }
+}
+
+namespace {
+
+/// "2 forms", and up to five of their names behind a colon.
+std::string CountedNames(const char* word, const std::vector<std::string>& names) {
+    constexpr std::size_t kShown = 5;
+    const std::string plural = std::string_view(word) == "query" ? "queries" : std::string(word) + "s";
+    std::string text = std::to_string(names.size()) + " " + (names.size() == 1 ? word : plural);
+    for (std::size_t i = 0; i < std::min(names.size(), kShown); ++i)
+        text += (i == 0 ? " (" : ", ") + names[i];
+    return text + (names.size() > kShown ? ", ...)" : ")");
+}
+
+} // namespace
+
+/// Exports and database of one application hold the same objects, unless one of them is out of date.
+void ApplicationModel::NoteDifferences(const DatabaseContent& content, const std::string& nativePath) {
+    static constexpr std::pair<ObjectKind, const char*> kWords[] = {
+        {ObjectKind::Form, "form"}, {ObjectKind::Report, "report"}, {ObjectKind::Macro, "macro"}};
+    for (const auto& [kind, word] : kWords) {
+        if (!kindInExports_[IndexOf(kind)])
+            continue;
+        KeyedList<bool> inDatabase;
+        std::vector<std::string> missing;
+        for (const auto& object : content.names) {
+            if (object.kind != kind || inDatabase.Contains(object.name))
+                continue;
+            inDatabase.Add(true, object.name);
+            if (!ListOf(kind).Contains(object.name))
+                missing.push_back(object.name);
+        }
+        std::vector<std::string> added;
+        for (const auto& object : ListOf(kind))
+            if (!inDatabase.Contains(object->name))
+                added.push_back(object->name);
+        if (!missing.empty())
+            notes_.push_back(
+                CountedNames(word, missing) + " of " + nativePath +
+                (missing.size() == 1 ? " isn't" : " aren't") +
+                " among the exports and left out; export again to document the database as it is.");
+        if (!added.empty())
+            notes_.push_back(CountedNames(word, added) + " of the exports " +
+                             (added.size() == 1 ? "isn't" : "aren't") + " in " + nativePath + ".");
     }
 }
 

@@ -56,11 +56,13 @@ void AddNote(const std::vector<ObjectSummary>& objects, ObjectKind kind, const c
     };
     if (unknown > 0)
         notes.push_back(noun(unknown) +
-                        (unknown == 1 ? " is known by name only, because the database file doesn't give its "
-                                        "design; it gets no topic. Export it as text to document it."
-                                      : " are known by name only, because the database file doesn't give "
-                                        "their designs; they get no topics. Export them as text to document "
-                                        "them."));
+                        (unknown == 1
+                             ? " is known by name only, because the database file doesn't give its "
+                               "design (those of 1997 can't be read); it gets no topic. Export it as "
+                               "text to document it."
+                             : " are known by name only, because the database file doesn't give "
+                               "their designs (those of 1997 can't be read); they get no topics. Export "
+                               "them as text to document them."));
     if (damaged > 0)
         notes.push_back(noun(damaged) + " can't be read.");
 }
@@ -88,6 +90,7 @@ ApplicationSummary SummarizeModel(ApplicationModel& model) {
             if (!IsSystemTable(kind, name))
                 summary.objects.push_back(Summarize(model, kind, name));
         }
+    summary.notes = model.Notes();
     AddNote(summary.objects, ObjectKind::Table, "table", summary.notes);
     AddNote(summary.objects, ObjectKind::Query, "query", summary.notes);
     AddNote(summary.objects, ObjectKind::Form, "form", summary.notes);

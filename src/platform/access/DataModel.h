@@ -69,13 +69,22 @@ struct QueryDefinition {
         std::string alias; ///< the table's name where none is given
     };
     struct Column {
-        std::string expression; ///< "Orders.Total", "Orders.*", "[a]+[b]"
+        std::string expression; ///< "Orders.Total", "Orders.*", "[a]+[b]"; of an update the field
         std::string alias;
+        std::string target = {}; ///< an append's field of the target; an update's new value
+        int role = 0;            ///< in a crosstab: 0 value, 1 column heading, 2 row heading
     };
     /// Conditions as they are written; an outer join keeps records without a partner.
     struct Join {
         std::string condition;
         bool outer = false;
+        std::string left = {}; ///< alias; empty where the source tells only the condition
+        std::string right = {};
+        bool keepsRight = false; ///< of an outer one: the records of the right side, not of the left
+    };
+    struct Parameter {
+        std::string name;
+        int type = 0; ///< the data library's number
     };
     struct Sort {
         std::string expression;
@@ -92,9 +101,15 @@ struct QueryDefinition {
     std::vector<Join> joins;
     std::string where; ///< empty for none
     std::vector<std::string> groups;
+    std::string having;
     std::vector<Sort> sorts;
-    bool distinct = false; ///< equal records count once
-    int top = 0;           ///< records at most, 0 for all
+    bool distinct = false;    ///< equal records count once
+    bool distinctRow = false; ///< records of the tables, not of the fields, count once
+    int top = 0;              ///< records at most, 0 for all
+    bool topPercent = false;
+    std::string target;     ///< table that a make-table or append query writes to
+    std::string targetFile; ///< database of the target; empty for this one
+    std::vector<Parameter> parameters;
     NamedTexts properties;
 };
 

@@ -12,11 +12,13 @@ NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(IndexDefinition, name, primary, unique, field
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(TableDefinition, name, fields, indexes, connect, sourceTable, attributes,
                                    properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Input, table, alias)
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Column, expression, alias)
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Join, condition, outer)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Column, expression, alias, target, role)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Join, condition, outer, left, right, keepsRight)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Parameter, name, type)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Sort, expression, descending)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition, name, operation, sql, inputs, columns, allFields, joins,
-                                   where, groups, sorts, distinct, top, properties)
+                                   where, groups, sorts, distinct, top, properties, having, distinctRow,
+                                   topPercent, target, targetFile, parameters)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(RelationDefinition, name, table, foreignTable, attributes, fields)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(NamedObject, kind, name, properties)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(DatabaseContent, tables, queries, relations, names)

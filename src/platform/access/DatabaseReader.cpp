@@ -164,28 +164,40 @@ private:
         switch (row.Number("Attribute")) {
         case 1:
             query.operation = static_cast<int>(row.Number("Flag"));
+            query.target = first;
+            query.targetFile = row.Text("Name2");
             if (query.operation >= 7)
                 query.sql = expression;
             break;
+        case 2:
+            query.parameters.push_back({first, static_cast<int>(row.Number("Flag"))});
+            break;
         case 3:
-            query.allFields = (row.Number("Flag") & 1) != 0;
-            query.distinct = (row.Number("Flag") & 2) != 0;
+            TakeQueryOptions(query, row.Number("Flag"), first);
             break;
         case 5:
             TakeQueryInput(query, expression, first, row.Text("Name2"));
             break;
         case 6:
             // An update's field stands behind its new value.
-            query.columns.push_back({query.operation == 4 ? row.Text("Name2") : expression, first});
+            if (query.operation == 4)
+                query.columns.push_back({row.Text("Name2"), first, expression});
+            else
+                query.columns.push_back(
+                    {expression, first, row.Text("Name2"), static_cast<int>(row.Number("Flag"))});
             break;
         case 7:
-            query.joins.push_back({expression, row.Number("Flag") != 1});
+            query.joins.push_back(
+                {expression, row.Number("Flag") != 1, first, row.Text("Name2"), row.Number("Flag") == 3});
             break;
         case 8:
             query.where = expression;
             break;
         case 9:
             query.groups.push_back(expression);
+            break;
+        case 10:
+            query.having = expression;
             break;
         case 11:
             query.sorts.push_back({expression, text::StartsWithIgnoringCase(first, "D")});
@@ -195,11 +207,20 @@ private:
         }
     }
 
+    static void TakeQueryOptions(QueryDefinition& query, std::int64_t flags, const std::string& top) {
+        query.allFields = (flags & 1) != 0;
+        query.distinct = (flags & 2) != 0;
+        query.distinctRow = (flags & 8) != 0;
+        query.top =
+            (flags & 16) != 0 ? static_cast<int>(std::clamp<std::int64_t>(ToNumber(top), 0, 1000000000)) : 0;
+        query.topPercent = (flags & 32) != 0;
+    }
+
     /// A union's parts stand as whole statements; the first one names the fields.
     static void TakeQueryInput(QueryDefinition& query, const std::string& expression,
                                const std::string& table, const std::string& alias) {
         if (query.operation == 9 && table.empty()) {
-            query.sql += (query.sql.empty() ? "" : " UNION ") + expression;
+            query.sql += (query.sql.empty() ? "" : "\r\nUNION ") + expression;
             return;
         }
         query.inputs.push_back({table, alias.empty() ? table : alias});
@@ -227,9 +248,11 @@ private:
     std::map<std::int64_t, QueryDefinition> queries_;
 };
 
-/// A query whose statement is known in whole is read from it.
+/// A query whose statement is known in whole is read from it, the others get one from their grid.
 void CompleteQuery(QueryDefinition& query) {
-    if (query.operation != 9 || query.sql.empty())
+    if (query.sql.empty())
+        query.sql = QueryStatement(query);
+    if (query.operation != 9)
         return;
     auto parsed = ParseQuerySql(query.sql);
     query.inputs = std::move(parsed.inputs);

@@ -17,6 +17,10 @@ QueryDefinition ParseQuerySql(std::string_view sql);
 /// Reads the text export of a query. Raises as ParseExportTree.
 QueryDefinition ReadQueryExport(std::string_view text, const std::string& nativePath);
 
+/// The statement for a grid, as the host writes it: a clause a line, ended by a semicolon. Empty for a query
+/// without a grid.
+std::string QueryStatement(const QueryDefinition& query);
+
 /// Looks tables and queries up by name; null for a name that isn't known.
 struct FieldSources {
     std::function<const TableDefinition*(const std::string&)> table;

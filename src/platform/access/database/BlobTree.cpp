@@ -29,6 +29,10 @@ std::int64_t SignedNumber(std::string_view bytes) {
     return bytes.empty() ? 0 : static_cast<std::int64_t>(number << unusedBits) >> unusedBits;
 }
 
+PropertyValue Number(std::int64_t number) {
+    return {Form::Number, std::to_string(number)};
+}
+
 /// "95.0": the fewest digits that give the number back, at least one behind the point.
 std::string FloatText(std::string_view bytes) {
     const auto number = std::bit_cast<float>(static_cast<std::uint32_t>(SignedNumber(bytes)));
@@ -41,16 +45,14 @@ std::string FloatText(std::string_view bytes) {
     return text.find('.') == std::string::npos ? text + ".0" : text;
 }
 
-std::string NameOf(const DesignRecord& record) {
+} // namespace
+
+std::string RecordName(const DesignRecord& record) {
     return record.code == kUnknownCode ? "UnknownSlot" + std::to_string(record.slot)
                                        : PropertyName(record.code);
 }
 
-PropertyValue Number(std::int64_t number) {
-    return {Form::Number, std::to_string(number)};
-}
-
-PropertyValue ValueOf(const DesignRecord& record) {
+PropertyValue RecordValue(const DesignRecord& record) {
     const auto& bytes = record.bytes;
     switch (record.type) {
     case ValueKind::Flag:
@@ -77,12 +79,14 @@ PropertyValue ValueOf(const DesignRecord& record) {
     return {Form::Bytes, std::string(bytes)};
 }
 
+namespace {
+
 /// Names of the events as properties by the codes of their macros; others tell it in the macro itself.
 std::string MacroProperty(const DesignRecord& record, const MacroGrid& grid) {
     if (IsKnownProperty(record.code))
         return PropertyName(record.code);
     const auto event = MacroEvent(grid);
-    return (event.empty() ? NameOf(record) : event) + "EmMacro";
+    return (event.empty() ? RecordName(record) : event) + "EmMacro";
 }
 
 void AddMacro(DesignObject& object, const DesignRecord& record) {
@@ -114,8 +118,8 @@ std::unique_ptr<DesignObject> Convert(const BlobObject& source) {
             continue;
         if (record.type == ValueKind::Macro)
             AddMacro(*object, record);
-        else if (auto value = ValueOf(record); value.form != Form::Bytes || !value.text.empty())
-            object->properties.emplace_back(NameOf(record), std::move(value));
+        else if (auto value = RecordValue(record); value.form != Form::Bytes || !value.text.empty())
+            object->properties.emplace_back(RecordName(record), std::move(value));
     }
     for (const auto& child : source.children) {
         object->children.push_back(Convert(*child));

@@ -12,4 +12,8 @@ namespace tovimar::platform::access {
 /// where the design keeps no codes. An embedded macro that can't be read is carried as bytes.
 std::unique_ptr<DesignObject> BlobBlocks(const DesignBlob& design);
 
+/// One property as it stands there, by name and value; an embedded macro as its bytes.
+std::string RecordName(const DesignRecord& record);
+PropertyValue RecordValue(const DesignRecord& record);
+
 } // namespace tovimar::platform::access
