@@ -88,16 +88,11 @@ TEST_F(CorpusTest, ReadsEveryDatabase) {
         for (const auto& object : summary.objects)
             EXPECT_EQ(object.error, "") << path << " " << object.name;
     }
-    const auto forms = CorpusFolder() + "/access-forms/Controls.accdb";
-    EXPECT_EQ(SummarizeApplication(forms).notes,
-              std::vector<std::string>{
-                  "29 forms are known by name only, because the database file doesn't give their designs; "
-                  "they get no topics. Export them as text to document them."});
-    EXPECT_EQ(RaisedBy([&] { ApplicationModel(forms).OpenDesign(ObjectKind::Form, "frmProducts"); }).text,
-              forms + ": of the form frmProducts only the name is known, its design isn't.");
     ApplicationModel queries(CorpusFolder() + "/databases/queryTestV1997.mdb");
     EXPECT_EQ(queries.QueryFields("SelectQuery").at(3).sourceTable, "Table2");
     EXPECT_EQ(queries.QueryFields("UnionQuery").size(), 2U);
+    EXPECT_EQ(queries.FindQuery("UpdateQuery")->sql.substr(0, 55),
+              "PARAMETERS [User Name] Text ( 255 );\r\nUPDATE Table1 SET");
 }
 
 /// Whatever is done to a file, reading it ends with an answer or with an error that names it.

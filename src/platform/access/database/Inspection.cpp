@@ -98,7 +98,7 @@ void InspectDesign(DatabaseDesigns& designs, Inspection& inspection) {
             MergeDelta(design, delta);
         inspector.Run(design);
         if (const auto members = designs.MemberBytes(inspection.kind, inspection.name); !members.empty())
-            inspector.Compare(ReadMemberList(members));
+            inspector.Compare(ReadMemberList(members, text::CodePage(designs.Code().codePage)));
     } catch (const RaisedError& failure) {
         inspector.Fault(failure.what());
     }

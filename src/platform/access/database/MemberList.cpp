@@ -1,7 +1,6 @@
 #include "platform/access/database/MemberList.h"
 
 #include "platform/access/database/Bytes.h"
-#include "platform/text/Text.h"
 
 namespace tovimar::platform::access {
 
@@ -13,13 +12,13 @@ constexpr std::uint16_t kFieldId = 0x1EFF;
 constexpr std::uint8_t kCustomControl = 0x77;
 constexpr std::size_t kCustomControlBytes = 36;
 
-Member ReadMember(ByteReader& reader) {
+Member ReadMember(ByteReader& reader, const text::CodePage& codePage) {
     Member member;
     member.typeId = reader.U16();
     reader.Skip(2);
     member.ordinal = reader.U32();
-    member.identifier = text::AnsiCodePage().Decode(reader.ZeroTerminated());
-    member.name = text::AnsiCodePage().Decode(reader.ZeroTerminated());
+    member.identifier = codePage.Decode(reader.ZeroTerminated());
+    member.name = codePage.Decode(reader.ZeroTerminated());
     if (member.name.empty())
         member.name = member.identifier;
     member.isField = member.typeId == kFieldId;
@@ -30,7 +29,7 @@ Member ReadMember(ByteReader& reader) {
 
 } // namespace
 
-MemberList ReadMemberList(std::string_view bytes) {
+MemberList ReadMemberList(std::string_view bytes, const text::CodePage& codePage) {
     ByteReader reader(bytes, "The member list");
     if (reader.U32() != kMagic)
         reader.Fail("begins with something else");
@@ -40,7 +39,7 @@ MemberList ReadMemberList(std::string_view bytes) {
     const auto count = reader.U32();
     reader.Skip(16); // the class of the object's module
     for (std::uint32_t i = 0; i < count; ++i)
-        list.members.push_back(ReadMember(reader));
+        list.members.push_back(ReadMember(reader, codePage));
     return list;
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/text/Text.h"
+
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -22,7 +24,8 @@ struct MemberList {
     std::vector<Member> members;
 };
 
+/// Names are in the code page of the database's language.
 /// Raises 0x80040001 "The member list ..." for bytes that end too early or are none.
-MemberList ReadMemberList(std::string_view bytes);
+MemberList ReadMemberList(std::string_view bytes, const text::CodePage& codePage);
 
 } // namespace tovimar::platform::access

@@ -155,6 +155,7 @@ VbaProject ReadVbaProject(const Storage& storage) {
         return project;
     }
     project.name = directory.projectName;
+    project.codePage = directory.codePage;
     const text::CodePage codePage(directory.codePage);
     for (const auto& entry : directory.modules) {
         try {

@@ -17,7 +17,8 @@ struct VbaModule {
 };
 
 struct VbaProject {
-    std::string name; ///< empty when it isn't known
+    std::string name;    ///< empty when it isn't known
+    int codePage = 1252; ///< of the code and of the names in member lists
     std::vector<VbaModule> modules;
     std::vector<std::string> faults; ///< modules that can't be read, with the reason
 };
