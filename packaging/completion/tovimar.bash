@@ -78,6 +78,7 @@ _tovimar_value() {
             _tovimar_offer "$typed" < <(_tovimar_projects)
             [[ ${#COMPREPLY[@]} -gt 0 ]] || _tovimar_files "$typed" '*.tvp'
             ;;
+        DATABASE) _tovimar_files "$typed" '*.[aA][cC][cC][dD][bB]' '*.[aA][cC][cC][dD][eE]' '*.[mM][dD][bBeE]' ;;
         WHAT) _tovimar_offer "$typed" <<<$'help\nweb\nfolder' ;;
         NAME) _tovimar_offer "$typed" < <(_tovimar_option_names) ;;
         VALUE) _tovimar_offer "$typed" < <(_tovimar_option_values "$_tovimar_before") ;;

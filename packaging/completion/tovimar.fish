@@ -24,7 +24,7 @@ function __tovimar_options
     tovimar options 2>/dev/null | string match -r '^[A-Za-z]+='
 end
 
-complete -c tovimar -f -n 'not __tovimar_takes "SOURCE|PROJECT|FILE"' -a '(__tovimar_section Commands)'
+complete -c tovimar -f -n 'not __tovimar_takes "SOURCE|PROJECT|FILE|DATABASE"' -a '(__tovimar_section Commands)'
 complete -c tovimar -n 'string match -q -- "-*" (commandline -ct)' -a '(__tovimar_section Options)'
 complete -c tovimar -n '__tovimar_takes PROJECT' -a "(tovimar projects 2>/dev/null | string match -r '^[^ ].*?(?=  \"|\$)')"
 complete -c tovimar -f -n '__tovimar_takes WHAT' -a 'help web folder'

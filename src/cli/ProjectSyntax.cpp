@@ -74,7 +74,7 @@ void AddSettings(CLI::App& app, Arguments& parsed) {
 }
 
 CLI::Option* AddDatabase(CLI::App& command, Arguments& parsed) {
-    return command.add_option("FILE", parsed.source, "the database file (.accdb, .mdb)")
+    return command.add_option("DATABASE", parsed.source, "the database file (.accdb, .mdb)")
         ->required()
         ->check(CLI::Validator(CLI::ExistingFile).description(""))
         ->type_name("");

@@ -25,7 +25,7 @@ TEST_F(CommandsTest, WhatTheyShow) {
         const char* golden;
         std::vector<std::string> arguments;
     };
-    const std::array<Shown, 14> all{{{"help.txt", {"--help"}},
+    const std::array<Shown, 16> all{{{"help.txt", {"--help"}},
                                      {"help-new.txt", {"new", "--help"}},
                                      {"help-generate.txt", {"generate", "--help"}},
                                      {"help-recompile.txt", {"recompile", "--help"}},
@@ -36,6 +36,8 @@ TEST_F(CommandsTest, WhatTheyShow) {
                                      {"help-settings.txt", {"settings", "--help"}},
                                      {"help-settings-set.txt", {"settings", "set", "--help"}},
                                      {"help-convert-contents.txt", {"convert-contents", "--help"}},
+                                     {"help-inspect.txt", {"inspect", "--help"}},
+                                     {"help-export.txt", {"export", "--help"}},
                                      {"version.txt", {"--version"}},
                                      {"options.txt", {"options"}},
                                      {"list.txt", {"list", kSample}}}};
