@@ -7,6 +7,7 @@
 #include <array>
 #include <fstream>
 #include <mdbtools.h>
+#include <unordered_map>
 
 namespace tovimar::platform::access {
 
@@ -15,6 +16,23 @@ namespace {
 constexpr int kMaxPropertyObjects = 10000;
 /// Longer memo texts are cut: statements of queries reach 64 KB.
 constexpr std::size_t kMaxCell = 200000;
+
+/// The newer formats tell on their first page how they are encrypted; it isn't filled otherwise.
+void CheckEncryption(const std::string& nativePath, std::ifstream& file) {
+    constexpr std::streamoff kFormat = 0x14;
+    constexpr std::streamoff kEncryptionLength = 0x299;
+    std::array<char, 3> bytes{};
+    file.seekg(kFormat);
+    file.read(bytes.data(), 1);
+    file.seekg(kEncryptionLength);
+    file.read(bytes.data() + 1, 2);
+    if (file && bytes[0] >= 2 && (bytes[1] != 0 || bytes[2] != 0))
+        throw RaisedError(kFailure1,
+                          nativePath +
+                              ": the database is encrypted with a password, so nothing in it can be read; "
+                              "save it without one to document it.",
+                          "DatabaseReader");
+}
 
 void CheckSignature(const std::string& nativePath) {
     std::array<char, 19> start{};
@@ -27,6 +45,7 @@ void CheckSignature(const std::string& nativePath) {
     file.seekg(0, std::ios::end);
     if (!known || start[1] != 1 || file.tellg() < 3 * 2048)
         throw RaisedError(kFailure1, nativePath + ": the file is no Access database.", "DatabaseReader");
+    CheckEncryption(nativePath, file);
 }
 
 FieldType TypeOf(int columnType) {
@@ -175,6 +194,8 @@ void MdbTable::ForEachRawRow(std::size_t most,
 
 struct MdbFile::Handle {
     MdbHandle* mdb = nullptr;
+    /// Names may be cut inside of a character; they are compared as the library gives them.
+    std::unordered_multimap<std::string, MdbCatalogEntry*> entries;
 };
 
 MdbFile::MdbFile(const std::string& nativePath) : handle_(std::make_unique<Handle>()) {
@@ -188,6 +209,10 @@ MdbFile::MdbFile(const std::string& nativePath) : handle_(std::make_unique<Handl
         throw RaisedError(kFailure1,
                           nativePath + ": the database can't be read; it may be damaged or encrypted.",
                           "DatabaseReader");
+    for (guint i = 0; i < handle_->mdb->catalog->len; ++i) {
+        auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(handle_->mdb->catalog, i));
+        handle_->entries.emplace(text::MakeValidUtf8(entry->object_name), entry);
+    }
     mdb_set_bind_size(handle_->mdb, kMaxCell);
     mdb_set_date_fmt(handle_->mdb, "%Y-%m-%d %H:%M:%S");
     mdb_set_shortdate_fmt(handle_->mdb, "%Y-%m-%d");
@@ -208,30 +233,25 @@ std::vector<std::string> MdbFile::TableNames() const {
 }
 
 std::unique_ptr<MdbTable> MdbFile::OpenTable(const std::string& name) {
-    // Names in the catalogue may be cut inside of a character; they are compared as the library gives them.
-    auto* catalog = handle_->mdb->catalog;
-    for (guint i = 0; i < catalog->len; ++i) {
-        auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(catalog, i));
-        if (entry->object_type != MDB_TABLE || text::MakeValidUtf8(entry->object_name) != name)
-            continue;
-        auto* table = mdb_read_table(entry);
-        if (!table)
-            return nullptr;
-        if (!mdb_read_columns(table) || table->columns->len < table->num_cols) {
-            mdb_free_tabledef(table);
-            return nullptr;
-        }
-        return std::unique_ptr<MdbTable>(new MdbTable(table));
+    const auto [first, last] = handle_->entries.equal_range(name);
+    const auto found =
+        std::find_if(first, last, [](const auto& named) { return named.second->object_type == MDB_TABLE; });
+    auto* table = found == last ? nullptr : mdb_read_table(found->second);
+    if (!table)
+        return nullptr;
+    if (!mdb_read_columns(table) || table->columns->len < table->num_cols) {
+        mdb_free_tabledef(table);
+        return nullptr;
     }
-    return nullptr;
+    return std::unique_ptr<MdbTable>(new MdbTable(table));
 }
 
 ObjectProperties MdbFile::Properties(const std::string& name) const {
     ObjectProperties read;
-    auto* catalog = handle_->mdb->catalog;
-    for (guint i = 0; i < catalog->len; ++i) {
-        auto* entry = static_cast<MdbCatalogEntry*>(g_ptr_array_index(catalog, i));
-        if (!entry->props || text::MakeValidUtf8(entry->object_name) != name)
+    const auto [first, last] = handle_->entries.equal_range(name);
+    for (auto named = first; named != last; ++named) {
+        const auto* entry = named->second;
+        if (!entry->props)
             continue;
         for (guint k = 0; k < std::min<guint>(entry->props->len, kMaxPropertyObjects); ++k) {
             const auto* properties = static_cast<MdbProperties*>(g_ptr_array_index(entry->props, k));

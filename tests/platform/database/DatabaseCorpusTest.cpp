@@ -9,6 +9,7 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <fstream>
 
 namespace tovimar::platform::access {
 namespace {
@@ -119,6 +120,20 @@ TEST_F(DatabaseCorpusTest, ExportsWinAndDifferencesAreTold) {
                   "1 form (Other) of the exports isn't in " + NativeApplication() + "/shop.accdb."}));
     EXPECT_EQ(model.Names(ObjectKind::Module), (std::vector<std::string>{"Class1", "Module1"}));
     EXPECT_THAT(*model.ModuleCode("Module1"), HasSubstr("Hello"));
+}
+
+TEST_F(DatabaseCorpusTest, EncryptedOnesAreTold) {
+    std::filesystem::create_directories(NativeApplication());
+    const auto path = NativeApplication() + "/secret.accdb";
+    std::filesystem::copy(CorpusFolder() + "/databases/vbaV2007.accdb", path);
+    std::fstream file(path, std::ios::binary | std::ios::in | std::ios::out);
+    file.seekp(0x299);
+    file.write("\xC8\x00\x04", 3);
+    file.close();
+    EXPECT_EQ(
+        RaisedBy([&] { ApplicationModel model(path); }).text,
+        path + ": the database is encrypted with a password, so nothing in it can be read; save it without "
+               "one to document it.");
 }
 
 TEST_F(DatabaseCorpusTest, DamageInsideADesignIsTold) {

@@ -53,7 +53,7 @@ TEST(MemberList, TellsNamesAndFields) {
     const std::string head = Le32(0xACCDEAF7) + Le16(0x96) + Le16(0) + Le32(0xFFFFFFFF);
     const auto list =
         ReadList(head + Le32(3) + std::string(16, 'g') + member(0x0D64, "lbl_One", "lbl One") +
-                       member(0x1EFF, "Price", "") + member(0x0277, "ocx", "") + std::string(36, 'c'));
+                 member(0x1EFF, "Price", "") + member(0x0277, "ocx", "") + std::string(36, 'c'));
     ASSERT_EQ(list.members.size(), 3U);
     EXPECT_EQ(list.members[0].name, "lbl One");
     EXPECT_TRUE(list.members[1].isField);

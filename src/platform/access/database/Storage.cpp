@@ -24,22 +24,25 @@ std::vector<FolderName> ReadFolderNames(std::string_view dirData) {
     return names;
 }
 
+namespace {
+
+std::string KeyOf(std::int32_t parent, std::string_view name) {
+    return std::to_string(parent) + "/" + text::FoldCase(std::string(name));
+}
+
+} // namespace
+
 Storage::Storage(std::vector<StorageNode> nodes) : nodes_(std::move(nodes)) {
     for (const auto& node : nodes_)
-        if (node.id == node.parent)
-            root_ = root_ == nullptr ? &node : root_;
-        else
-            children_[node.parent].push_back(&node);
+        if (node.id != node.parent)
+            children_.emplace(KeyOf(node.parent, node.name), &node);
+        else if (root_ == nullptr)
+            root_ = &node;
 }
 
 const StorageNode* Storage::Child(const StorageNode& folder, std::string_view name) const {
-    const auto found = children_.find(folder.id);
-    if (found == children_.end())
-        return nullptr;
-    for (const auto* child : found->second)
-        if (text::EqualsIgnoringCase(child->name, name))
-            return child;
-    return nullptr;
+    const auto found = children_.find(KeyOf(folder.id, name));
+    return found == children_.end() ? nullptr : found->second;
 }
 
 const StorageNode* Storage::Find(const std::vector<std::string_view>& path) const {
@@ -47,11 +50,6 @@ const StorageNode* Storage::Find(const std::vector<std::string_view>& path) cons
     for (const auto name : path)
         node = node != nullptr ? Child(*node, name) : nullptr;
     return node;
-}
-
-std::vector<const StorageNode*> Storage::Children(const StorageNode& folder) const {
-    const auto found = children_.find(folder.id);
-    return found == children_.end() ? std::vector<const StorageNode*>() : found->second;
 }
 
 } // namespace tovimar::platform::access

@@ -1,9 +1,9 @@
 #pragma once
 
 #include <cstdint>
-#include <map>
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 /// The tree of folders and streams in which a database keeps designs, macros and code.
@@ -37,11 +37,10 @@ public:
     const StorageNode* Root() const { return root_; }
     /// Down from the root; null when a step is missing.
     const StorageNode* Find(const std::vector<std::string_view>& path) const;
-    std::vector<const StorageNode*> Children(const StorageNode& folder) const;
 
 private:
     std::vector<StorageNode> nodes_;
-    std::map<std::int32_t, std::vector<const StorageNode*>> children_;
+    std::unordered_map<std::string, const StorageNode*> children_; ///< by the parent's id and the folded name
     const StorageNode* root_ = nullptr;
 };
 
