@@ -33,7 +33,7 @@ constexpr std::array<Substitute, 26> kSubstitutes{{{"arial narrow", "Liberation 
                                                    {"candara", "Carlito"},
                                                    {"times", "Liberation Serif"},
                                                    {"georgia", "Liberation Serif"},
-                                                   {"cambria", "Liberation Serif"},
+                                                   {"cambria", "Caladea"},
                                                    {"garamond", "Liberation Serif"},
                                                    {"book antiqua", "Liberation Serif"},
                                                    {"bookman", "Liberation Serif"},
