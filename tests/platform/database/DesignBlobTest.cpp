@@ -106,6 +106,11 @@ TEST(DesignBlob, NewerNumbersAreTheSameProperties) {
     EXPECT_EQ(TextOf(Orders(/*shift=*/1).End()), kOrdersText);
 }
 
+TEST(DesignBlob, TheHelpFileIsKnownByItsName) {
+    EXPECT_THAT(TextOf(BlobText(150).Text(229, 218, "Shop.CHM").Record(156, 219, 4, Le32(4711)).End()),
+                HasSubstr("    HelpFile =\"Shop.CHM\"\n    HelpContextId =4711\n"));
+}
+
 TEST(DesignBlob, AnswersAsItsTextDoes) {
     const auto blob = Orders().End();
     const auto read =

@@ -5,6 +5,7 @@
 #include "platform/access/database/Bytes.h"
 #include "platform/access/database/MacroGrid.h"
 #include "platform/access/database/PropertyCodes.h"
+#include "platform/text/Text.h"
 
 #include <array>
 #include <bit>
@@ -110,6 +111,14 @@ bool IsNoPicture(const DesignRecord& record) {
     return record.code == 0 && SignedNumber(record.bytes.substr(0, 8)) == -1;
 }
 
+/// The number of the help file was met in no design at hand, but nothing else of a form is the name of one.
+bool IsHelpFile(const BlobObject& object, const DesignRecord& record, const PropertyValue& value) {
+    const bool isRoot = object.type == ObjectTypeNumber("Form") || object.type == ObjectTypeNumber("Report");
+    const auto name = text::ToLower(value.text);
+    return isRoot && value.form == Form::Text && !IsKnownProperty(record.code) &&
+           (name.ends_with(".chm") || name.ends_with(".hlp"));
+}
+
 std::unique_ptr<DesignObject> Convert(const BlobObject& source) {
     auto object = std::make_unique<DesignObject>();
     object->type = ObjectTypeName(source.type);
@@ -119,7 +128,8 @@ std::unique_ptr<DesignObject> Convert(const BlobObject& source) {
         if (record.type == ValueKind::Macro)
             AddMacro(*object, record);
         else if (auto value = RecordValue(record); value.form != Form::Bytes || !value.text.empty())
-            object->properties.emplace_back(RecordName(record), std::move(value));
+            object->properties.emplace_back(
+                IsHelpFile(source, record, value) ? "HelpFile" : RecordName(record), value);
     }
     for (const auto& child : source.children) {
         object->children.push_back(Convert(*child));
