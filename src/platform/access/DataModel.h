@@ -65,8 +65,9 @@ struct TableDefinition {
 /// A query as its design grid has it. For a query known by its statement alone, `sql` is parsed.
 struct QueryDefinition {
     struct Input {
-        std::string table; ///< table or query, or "" for a nested statement
-        std::string alias; ///< the table's name where none is given
+        std::string table;          ///< table or query, or "" for a nested statement
+        std::string alias;          ///< the table's name where none is given
+        std::string statement = {}; ///< the nested one, where the source has it apart
     };
     struct Column {
         std::string expression; ///< "Orders.Total", "Orders.*", "[a]+[b]"; of an update the field

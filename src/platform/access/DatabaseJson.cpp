@@ -11,7 +11,7 @@ NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(FieldDefinition, name, type, size, autoNumber
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(IndexDefinition, name, primary, unique, fields)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(TableDefinition, name, fields, indexes, connect, sourceTable, attributes,
                                    properties)
-NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Input, table, alias)
+NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Input, table, alias, statement)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Column, expression, alias, target, role)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Join, condition, outer, left, right, keepsRight)
 NLOHMANN_DEFINE_TYPE_NON_INTRUSIVE(QueryDefinition::Parameter, name, type)

@@ -223,7 +223,7 @@ private:
             query.sql += (query.sql.empty() ? "" : "\r\nUNION ") + expression;
             return;
         }
-        query.inputs.push_back({table, alias.empty() ? table : alias});
+        query.inputs.push_back({table, alias.empty() ? table : alias, table.empty() ? expression : ""});
     }
 
     void TakeRelationRow(const NamedRow& row) {

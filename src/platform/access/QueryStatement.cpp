@@ -21,6 +21,12 @@ std::string Bracketed(const std::string& name) {
 }
 
 std::string InputText(const QueryDefinition::Input& input) {
+    if (input.table.empty()) {
+        auto nested = text::TrimWhitespace(input.statement);
+        if (nested.ends_with(';'))
+            nested.pop_back();
+        return "(" + nested + ") AS " + Bracketed(input.alias);
+    }
     std::string text = Bracketed(input.table);
     if (!input.alias.empty() && input.alias != input.table)
         text += " AS " + Bracketed(input.alias);
