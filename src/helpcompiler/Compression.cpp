@@ -1,34 +1,19 @@
 #include "helpcompiler/Compression.h"
 
 #include "helpcompiler/Lzx.h"
+#include "helpcompiler/Threads.h"
 
 #include <algorithm>
-#include <atomic>
 #include <cstddef>
-#include <thread>
 
 namespace tovimar::helpcompiler {
 namespace {
 
 constexpr std::size_t kBatch = 64 * kLzxInterval;
 
-/// Calls `work` for every number below `count`, on several threads.
-template <typename Work> void ForAll(std::size_t count, unsigned threads, const Work& work) {
-    std::atomic<std::size_t> next{0};
-    const auto run = [&] {
-        for (std::size_t i = next++; i < count; i = next++)
-            work(i);
-    };
-    std::vector<std::jthread> helpers;
-    for (unsigned i = 1; i < threads && i < count; ++i)
-        helpers.emplace_back(run);
-    run();
-}
-
 } // namespace
 
-Compressor::Compressor(unsigned threads)
-    : threads_(threads != 0 ? threads : std::max(1U, std::thread::hardware_concurrency())) {}
+Compressor::Compressor(unsigned threads) : threads_(ThreadCount(threads)) {}
 
 std::uint64_t Compressor::Add(std::string_view bytes) {
     const std::uint64_t offset = content_.length;

@@ -58,7 +58,7 @@ std::string ResetTable(const CompressedContent& content) {
 } // namespace
 
 bool Container::Add(const std::string& name, std::string_view bytes, bool compressed) {
-    if (name.size() > kLongestName || !names_.insert(name).second)
+    if (name.size() > kLongestName || !names_.insert(text::FoldCase(name)).second)
         return false;
     if (compressed)
         entries_.push_back({name, 1, compressor_.Add(bytes), bytes.size()});

@@ -19,6 +19,7 @@ public:
     explicit Container(std::uint32_t language, std::uint32_t time, unsigned threads = 0)
         : language_(language), time_(time), compressor_(threads) {}
 
+    void SetTime(std::uint32_t time) { time_ = time; }
     /// Names begin with "/". A name that stands already, or is longer than a name may be, is refused.
     bool Add(const std::string& name, std::string_view bytes, bool compressed = true);
     /// All bytes of the file; nothing can be added then.
