@@ -6,7 +6,7 @@ namespace {
 using Table = std::array<ByteTraits, 256>;
 
 /// 80 to FF; a blank is a byte that has no letter.
-constexpr std::string_view kNorms = "          s o               s oy"
+constexpr std::string_view kNorms = "          s o             s o  y"
                                     "                                "
                                     "aaaaaaaceeeeiiiidnooooo ouuuuy s"
                                     "aaaaaaaceeeeiiiionooooo ouuuuy y";

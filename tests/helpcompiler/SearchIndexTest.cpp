@@ -1,8 +1,8 @@
 #include "helpcompiler/SearchIndex.h"
-#include "SearchReader.h"
 #include "helpcompiler/CodePageText.h"
 #include "helpcompiler/PageReader.h"
 #include "helpcompiler/WordTable.h"
+#include "support/SearchReader.h"
 
 #include <gtest/gtest.h>
 
@@ -92,6 +92,8 @@ TEST(WordsTest, AreSplitAndFoldedAsTheViewerLooksThemUp) {
     EXPECT_EQ(WordsOf("\xC4rger \xC9t\xC9 stra\xDF"
                       "e \xC6sop \x9Cuvre Nu\xF1o"),
               (Words{"arger", "ete", "strasse", "aesop", "oeuvre", "nuno"}));
+    EXPECT_EQ(WordsOf("\x8Akoda \x9Akola \x9Fves \xF0 \xDE\xFE"),
+              (Words{"skoda", "skola", "yves", "o", "\xDE\xFE"}));
     EXPECT_EQ(WordsOf("a\xA0"
                       "b\x97"
                       "c\xD7"

@@ -1,4 +1,4 @@
-#include "SearchReader.h"
+#include "support/SearchReader.h"
 
 #include "helpcompiler/WordTable.h"
 
