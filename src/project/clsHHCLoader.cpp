@@ -3,6 +3,7 @@
 #include "foundation/CXMLFile.h"
 #include "foundation/ErrorTrap.h"
 #include "platform/Environment.h"
+#include "platform/text/ByteOrderMark.h"
 #include "platform/text/Text.h"
 #include "platform/xml/XmlCheck.h"
 #include "platform/xml/XmlDocument.h"
@@ -39,18 +40,8 @@ std::string WellFormedLine(std::string line) {
 }
 
 std::string TextOfBytes(const std::string& bytes) {
-    const bool bigEndian = bytes.starts_with("\xFE\xFF");
-    if (!bigEndian && !bytes.starts_with("\xFF\xFE"))
-        return bytes.starts_with("\xEF\xBB\xBF") ? text::MakeValidUtf8(bytes.substr(3))
-                                                 : text::AnsiCodePage().Decode(bytes);
-    std::u16string units;
-    units.reserve(bytes.size() / 2);
-    for (std::size_t i = 2; i + 1 < bytes.size(); i += 2) {
-        const auto first = static_cast<unsigned char>(bytes[i]);
-        const auto second = static_cast<unsigned char>(bytes[i + 1]);
-        units += static_cast<char16_t>(bigEndian ? first << 8U | second : second << 8U | first);
-    }
-    return text::FromUtf16(units);
+    const auto marked = text::DecodeMarked(bytes);
+    return marked ? *marked : text::AnsiCodePage().Decode(bytes);
 }
 
 /// A header in the middle of a line without an end makes no document either.

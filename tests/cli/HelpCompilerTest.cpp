@@ -6,12 +6,10 @@
 namespace tovimar::test {
 namespace {
 
-/// The front that stands beside the command and runs the compiler.
+/// The help compiler beside the command.
 class HelpCompilerTest : public ProgramTest {
 protected:
     void SetUp() override {
-        if (!IsInstalled("chmcmd"))
-            GTEST_SKIP() << "chmcmd of the package fp-utils isn't installed";
         program = (fs::path(TOVIMAR_PROGRAM).parent_path() / "tools/hhc.exe").string();
         Write("my help/a.htm", "<html><head><title>A</title></head><body>a</body></html>");
         Write("my help/images/Pic.jpg", "picture");
@@ -46,9 +44,33 @@ TEST_F(HelpCompilerTest, AMissingFileIsAComplaintNotTheEnd) {
     Run({"my help/p.hhp"}).ExpectExit(1);
 }
 
+TEST_F(HelpCompilerTest, TheOtherCompilerWorksWhereItIsAskedFor) {
+    if (!IsInstalled("chmcmd"))
+        GTEST_SKIP() << "chmcmd of the package fp-utils isn't installed";
+    variables["HELP_COMPILER"] = "chmcmd";
+    WriteProject("A.htm\r\nIMAGES\\pic.jpg\r\ngone.htm\r\n");
+    Run({"my help/p.hhp"}).ExpectExit(1).ExpectErrorsHold("'gone.htm' is in the project but not on the disk");
+    EXPECT_THAT(Made(), ::testing::ElementsAre("p.chm"));
+}
+
+TEST_F(HelpCompilerTest, KeepsTheOldFileWhenNothingIsCompiled) {
+    Write("my help/p.chm", "old");
+    WriteProject("gone.htm\r\n");
+    Run({"my help/p.hhp"}).ExpectExit(1).ExpectErrorsHold("lists no file that exists");
+    EXPECT_EQ(ReadWhole(Folder() / "my help/p.chm"), "old");
+    Write("my help/pages/b.htm", "<a href=../a.htm><a href=../../away.htm>\n<img src=none.gif>");
+    WriteProject("pages\\b.htm\r\n");
+    Run({"my help/p.hhp"})
+        .ExpectExit(0)
+        .ExpectErrorsHold("hhc: warning: pages/b.htm(1): '../../away.htm' leads out of the project\n"
+                          "hhc: warning: pages/b.htm(2): 'none.gif' isn't on the disk\n");
+    EXPECT_NE(ReadWhole(Folder() / "my help/p.chm").find("/a.htm"), std::string::npos);
+}
+
 TEST_F(HelpCompilerTest, NoProjectOrNoCompilerIsTold) {
     Run({"my help/none.hhp"}).ExpectExit(2);
     WriteProject("a.htm\r\n");
+    variables["HELP_COMPILER"] = "chmcmd";
     searchPath = "/nowhere";
     Run({"my help/p.hhp"}).ExpectExit(2).ExpectErrorsHold("fp-utils");
     EXPECT_THAT(Made(), ::testing::IsEmpty());
