@@ -15,6 +15,7 @@ struct Arguments {
         None,
         New,
         Generate,
+        Regenerate,
         Recompile,
         Screenshot,
         Open,

@@ -9,6 +9,7 @@ class Surroundings;
 /// Each gives the program's exit code and tells its failures itself.
 int CreateProject(const Arguments& arguments, Surroundings& surroundings);
 int Generate(const Arguments& arguments, Surroundings& surroundings);
+int Regenerate(const Arguments& arguments, Surroundings& surroundings);
 int Recompile(const Arguments& arguments, Surroundings& surroundings);
 int RetakeScreenshot(const Arguments& arguments, Surroundings& surroundings);
 int Open(const Arguments& arguments, Surroundings& surroundings);

@@ -39,6 +39,26 @@ void AddVerbose(CLI::App& command, Arguments& parsed) {
     command.add_flag("--verbose", parsed.verbose, "tell each object, warnings and the compiler's output");
 }
 
+void AddWriteBack(CLI::App& command, Arguments& parsed) {
+    command.add_flag("--write-back", parsed.writeBack,
+                     "write new context ids into the exports of SOURCE; each changed one is kept as .bak");
+}
+
+void AddRegenerate(CLI::App& app, Arguments& parsed) {
+    auto* command = AddCommand(app, parsed, "regenerate",
+                               "add the application's new objects to a help; all that stands in it stays",
+                               Command::Regenerate, "tovimar regenerate shop-help");
+    AddProject(*command, parsed)->required();
+    command
+        ->add_option("SOURCE", parsed.source,
+                     "the application, where it isn't at the place that is remembered for the project")
+        ->check(Existing())
+        ->type_name("");
+    AddWriteBack(*command, parsed);
+    AddYes(*command, parsed);
+    AddVerbose(*command, parsed);
+}
+
 void AddScreenshot(CLI::App& app, Arguments& parsed) {
     using Kind = Arguments::ObjectKind;
     auto* command =
@@ -74,10 +94,11 @@ void AddGenerationSyntax(CLI::App& app, Arguments& parsed) {
     AddSource(*generate, parsed, kSourceOrProject);
     AddOutput(*generate, parsed);
     AddCompilation(*generate, parsed);
-    generate->add_flag("--write-back", parsed.writeBack,
-                       "write new context ids into the exports of SOURCE; each changed one is kept as .bak");
+    AddWriteBack(*generate, parsed);
     AddYes(*generate, parsed);
     AddVerbose(*generate, parsed);
+
+    AddRegenerate(app, parsed);
 
     auto* recompile =
         AddCommand(app, parsed, "recompile", "make a help again from its pages and contents as they stand",

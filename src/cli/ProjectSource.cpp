@@ -72,10 +72,10 @@ HostObject ProjectSource::OpenApplication() {
 }
 
 void ProjectSource::Open() {
-    const HostObject application = OpenApplication();
+    application_ = OpenApplication();
     StopIfInterrupted();
     RegisterSettingsLoader();
-    if (client_.Connect(application) != kSuccess)
+    if (client_.Connect(application_) != kSuccess)
         throw Stop{"'" + source_ + "' can't be opened"};
     StopIfInterrupted();
 }

@@ -26,6 +26,8 @@ public:
     const std::string& ProjectFile() const { return projectFile_; }
     /// Native path of the application; empty before `Open`.
     const std::string& Source() const { return source_; }
+    /// Null before `Open`.
+    const HostObject& Application() const { return application_; }
     /// Reads the application, the one of --source or the one that the catalogue remembers, and connects to
     /// it.
     void Open();
@@ -37,6 +39,7 @@ private:
     Surroundings& surroundings_;
     std::string projectFile_;
     std::string source_;
+    HostObject application_;
     CTovimarClient client_;
 };
 

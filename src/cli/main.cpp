@@ -19,6 +19,8 @@ int RunCommand(const Arguments& arguments, Surroundings& surroundings) {
         return CreateProject(arguments, surroundings);
     case Command::Generate:
         return Generate(arguments, surroundings);
+    case Command::Regenerate:
+        return Regenerate(arguments, surroundings);
     case Command::Recompile:
         return Recompile(arguments, surroundings);
     case Command::Screenshot:

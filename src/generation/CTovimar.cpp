@@ -236,7 +236,8 @@ ResultCode CTovimar::GenerateHTMLForProject(bool /*vfCompile*/, bool vfRegenerat
             ShowMessage("Errors occurred during help generation - check the Folder:\r\n\r\n" +
                             parameters_->FolderForGeneratedHelp(),
                         kMsgCritical, {});
-        else
+        else if (!vfRegenerate)
+            // New pages are looked over first; the help is compiled when the writer says so.
             result = CompileAndCopy();
     });
     return trapped != kSuccess ? trapped : result;

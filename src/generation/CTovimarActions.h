@@ -81,6 +81,8 @@ public:
     void OpenHelpFolder();
     /// As `CTovimarCompiler::RecompileHelpProject`.
     ResultCode RecompileHelpProject(bool vfSkipOpeningOfRecompiledHelp = false);
+    /// As `CTovimarCompiler::RegenerateHelpProject`.
+    ResultCode RegenerateHelpProject();
 
     // The system's own help, and who made it.
     void OpenHelpTopics();

@@ -11,6 +11,7 @@
 #include "host/server/CTovimarServerAgent.h"
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
+#include "project/CHelpPrjTreeNode.h"
 
 namespace tovimar {
 namespace {
@@ -18,6 +19,9 @@ namespace {
 constexpr const char* kClass = "CTovimarCompiler";
 
 } // namespace
+
+CTovimarCompiler::CTovimarCompiler() = default;
+CTovimarCompiler::~CTovimarCompiler() = default;
 
 bool CTovimarCompiler::CompileHtmlHelp() {
     Trapped(kClass, "CompileHtmlHelp", [&] {

@@ -141,6 +141,10 @@ ResultCode CTovimarActions::RecompileHelpProject(bool vfSkipOpeningOfRecompiledH
     return CTovimarCompiler().RecompileHelpProject(vfSkipOpeningOfRecompiledHelp);
 }
 
+ResultCode CTovimarActions::RegenerateHelpProject() {
+    return CTovimarCompiler().RegenerateHelpProject();
+}
+
 void CTovimarActions::OpenHelpTopics() {
     OpenOwnHelp("OpenHelpTopics", &clsHtmlHelp::OpenTOC);
 }

@@ -85,8 +85,7 @@ void ShowNode(const CHelpPrjTreeNode& node, std::int32_t level, Walk& walk) {
 
 /// The ids of an object that isn't made again still count as used.
 void ExtractSavedIds(const CHelpPrjTreeNode& node, CTovimar& generator) {
-    if (node.ProcessCode() != kSourceObject ||
-        (node.ObjectType() != ObjectType::kForm && node.ObjectType() != ObjectType::kReport))
+    if (!node.IsObjectNode())
         return;
     if (const auto form = generator.HelpProjectTree().Definitions().Load(node.XmlFormFullPath()))
         generator.HelpContextIds().ExtractUsedHelpContextIds(*form);

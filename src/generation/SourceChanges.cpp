@@ -40,8 +40,9 @@ SourceChanges::SourceChanges(Target target, const std::string& sourceFolder, con
     : target_(target), sourceFolder_(platform::WithTrailingBackslash(sourceFolder)),
       copiesFolder_(platform::WithTrailingBackslash(copiesFolder)) {}
 
-void SourceChanges::Attach(const HostObject& application) {
-    RemoveCopies();
+void SourceChanges::Attach(const HostObject& application, Earlier earlier) {
+    if (earlier == Earlier::Remove)
+        RemoveCopies();
     platform::access::SetObjectSaver(application, [this](const SavedObject& saved) { Take(saved); });
 }
 

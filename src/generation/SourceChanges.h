@@ -16,6 +16,9 @@ struct SavedObject;
 /// that differ from the application's own in these lines only. Objects of a database file can't be written.
 class SourceChanges {
 public:
+    /// Copies that an earlier run left: of objects that need no change any more, or of some that this run
+    /// doesn't come to.
+    enum class Earlier { Remove, Keep };
     enum class Target {
         Copies,   ///< into a tree of folders of its own, changed files only
         Originals ///< over the exports; each one stays beside its new text as "NAME.bak"
@@ -25,8 +28,7 @@ public:
     SourceChanges(Target target, const std::string& sourceFolder, const std::string& copiesFolder);
 
     /// Takes everything that the application saves from now on; it mustn't save after this object's end.
-    /// Copies of an earlier run go: they may be of objects that need no change any more.
-    void Attach(const HostObject& application);
+    void Attach(const HostObject& application, Earlier earlier = Earlier::Remove);
 
     std::size_t Written() const { return written_; }
     /// Names of saved objects that have no export.

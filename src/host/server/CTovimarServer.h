@@ -61,6 +61,8 @@ public:
     void OpenHelpProjectIndex();
     void OpenHelpFolder();
     ResultCode RecompileHelpProject(bool vfSkipOpeningOfRecompiledHelp = false);
+    /// Over the source project at hand.
+    ResultCode RegenerateHelpProject();
     void OpenHelpTopics();
     void OpenHelpIndex();
     void OpenHelpSearch();
@@ -79,6 +81,8 @@ public:
     void OpenHelpEditorForm();
     void SetFocusToHTMLEditor();
     void SetFocusOnHelpEditorForm();
+    /// Lets the host see that the form is gone.
+    void CloseEditor();
     /// Makes the editor's form; set by a program with windows.
     std::function<std::unique_ptr<IHelpEditorForm>()> MakeHelpEditorForm;
     /// By the name, without regard to case.
@@ -104,7 +108,6 @@ public:
 
 private:
     void LoadProject(const std::string& path, ResultCode& result);
-    void CloseEditor();
 
     std::unique_ptr<CTovimarServerData> data_;
     std::unique_ptr<CTovimarServerAgent> agent_;

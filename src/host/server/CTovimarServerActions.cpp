@@ -117,6 +117,16 @@ ResultCode CTovimarServer::RecompileHelpProject(bool vfSkipOpeningOfRecompiledHe
     return trapped != kSuccess ? trapped : result;
 }
 
+ResultCode CTovimarServer::RegenerateHelpProject() {
+    ResultCode result = kSuccess;
+    const ResultCode trapped = Trapped(kClass, "RegenerateHelpProject", [&] {
+        auto& host = HostAgent();
+        host.SetCurrentSourceProject(host.CurrentSourceProjectName());
+        result = Actions().RegenerateHelpProject();
+    });
+    return trapped != kSuccess ? trapped : result;
+}
+
 void CTovimarServer::OpenHelpTopics() {
     Trapped(kClass, "OpenHelpTopics", [this] { Actions().OpenHelpTopics(); });
 }

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace tovimar {
+
+class HtmlNode;
+
+/// Writes nodes as markup: as they were written where they weren't changed.
+class HtmlWriter {
+public:
+    explicit HtmlWriter(std::string& out) : out_(out) {}
+
+    /// The node with all below it.
+    void Write(const HtmlNode& node);
+    void WriteChildren(const HtmlNode& parent);
+    void WriteStart(const HtmlNode& node);
+
+private:
+    void WriteEnd(const HtmlNode& node);
+    void WriteText(const HtmlNode& node);
+    void WriteOther(const HtmlNode& node);
+
+    std::string& out_;
+};
+
+/// "&", "<" and ">" as entities, and the blank that doesn't break; with `quotes` the double quote as well.
+void AppendEncoded(std::string& out, std::string_view text, bool quotes);
+
+} // namespace tovimar
