@@ -53,6 +53,7 @@ public:
         }
         project_.help.contents = TakeSitemap(project_.contentsFile, project_.help.contentsFile);
         project_.help.index = TakeSitemap(project_.indexFile, project_.help.indexFile);
+        TakeStopList();
         FindDefaultTopic();
         CheckTargets(project_.help.contents, project_.contentsFile);
         CheckTargets(project_.help.index, project_.indexFile);
@@ -102,6 +103,23 @@ private:
                    "'" + page_.Decode(unheld.value) + "' has characters beyond code page " +
                        std::to_string(page_.Number())});
         return map;
+    }
+
+    /// Words that are too common to be looked for, one a line.
+    void TakeStopList() {
+        if (project_.stopListFile.empty())
+            return;
+        const auto found = folder_.Find(project_.stopListFile);
+        if (!found) {
+            Complain("'" + project_.stopListFile + "' is in the project but not on the disk");
+            return;
+        }
+        std::unordered_set<std::string> words;
+        SplitWords(ReadWhole(folder_.PathOf(*found)), page_.Number(), [&](std::string_view word) {
+            if (words.emplace(word).second)
+                project_.help.stopWords.emplace_back(word);
+        });
+        search_.SetStopWords(std::move(words));
     }
 
     void FindDefaultTopic() {

@@ -66,6 +66,7 @@ public:
     HelpProject Read(std::string_view bytes) {
         const std::uint32_t language = LanguageIn(bytes);
         project_.help.language = language;
+        project_.help.binaryIndex = true; // unless the project says No
         project_.help.codePage = CodePageOfLanguage(language);
         page_.emplace(project_.help.codePage);
         std::istringstream lines(Text(bytes));
