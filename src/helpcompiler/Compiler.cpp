@@ -69,6 +69,9 @@ private:
     void Complain(const std::string& text) {
         tell_({Message::Kind::Complaint, path_.filename().string(), 0, text});
     }
+    void Warn(const std::string& text) {
+        tell_({Message::Kind::Warning, path_.filename().string(), 0, text});
+    }
 
     void Queue(const std::string& name) {
         if (queued_.insert(text::FoldCase(name)).second)
@@ -142,11 +145,11 @@ private:
             const std::string name = page_.Decode(context.target.substr(0, context.target.find('#')));
             const auto found = folder_.Find(name);
             if (!found) {
-                Complain("'" + name + "' has a number but isn't on the disk");
+                Warn("'" + name + "' has a number but isn't on the disk");
                 continue;
             }
             if (!ids.insert(context.id).second)
-                Complain("the number " + std::to_string(context.id) + " stands for two pages");
+                Warn("the number " + std::to_string(context.id) + " stands for two pages");
             Queue(*found);
             good.push_back(
                 {context.id, page_.Encode(*found) + context.target.substr(std::min(context.target.find('#'),
