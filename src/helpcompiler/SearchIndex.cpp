@@ -66,16 +66,16 @@ public:
 private:
     void PutBits(std::uint32_t bits, unsigned count) {
         while (count-- > 0) {
-            byte_ = static_cast<unsigned char>(byte_ << 1 | (bits >> count & 1U));
+            byte_ = byte_ << 1U | (bits >> count & 1U);
             if (++count_ == 8) {
-                out_.push_back(static_cast<char>(byte_));
+                out_.push_back(static_cast<char>(byte_ & 0xFFU));
                 count_ = 0;
             }
         }
     }
 
     std::string& out_;
-    unsigned char byte_ = 0;
+    unsigned byte_ = 0;
     unsigned count_ = 0;
 };
 

@@ -66,7 +66,7 @@ protected:
 };
 
 TEST_F(ChmReadersTest, TheSampleIsListedExtractedAndSearched) {
-    Run({"generate", kSample, "--output", "help"}).ExpectExit(0);
+    Run({"generate", kSample, "--output", "help", "--copy-to", "."}).ExpectExit(0);
     fs::remove(Folder() / "orchard.chm");
     ExpectAllFiles("help", "help/orchard.chm");
     const auto found = Found("help/orchard.chm", "cp1252", "restaurants printed zebra");
