@@ -13,16 +13,16 @@
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
+#include <cstdio>
+
 namespace tovimar::cli {
 
 void CheckCompiler() {
     if (!Session::Parameters()->CompileHTMLHelp)
         return;
     if (GetHtmlHelpWorkshopExePath().empty())
-        throw Stop{
-            "the help compiler isn't installed; nothing was written\n"
-            "Install the Debian package fp-utils (it has chmcmd), or pass --no-compile to write everything "
-            "but the .chm."};
+        throw Stop{"the help compiler isn't installed; nothing was written\n"
+                   "It is the file hhc.exe beside the command; --no-compile writes everything but the .chm."};
     TheServer().TestThatHtmlWorkshopInstalled();
 }
 
@@ -53,12 +53,24 @@ bool CompilerSucceeded(bool verbose) {
     return true;
 }
 
+/// "1.4 MB, compiled in 0.2 seconds"
+static std::string SizeAndTime(const std::string& file) {
+    constexpr double kMegabyte = 1e6;
+    char text[80];
+    std::snprintf(text, sizeof text, "%.1f MB, compiled in %.1f seconds",
+                  static_cast<double>(platform::Env().files->FileLength(file)) / kMegabyte,
+                  Session::Generator()->CompilerSeconds);
+    return text;
+}
+
 void ShowCompiledHelp() {
     if (!Session::Parameters()->CompileHTMLHelp)
         return;
     const std::string compiled = Session::Parameters()->CompiledHelpFullPath();
     const std::string copied = CTovimarCompiler().GetCopiedHelpFullPath();
     ShowFile("Compiled help: ", compiled);
+    if (platform::Env().files->FileExists(compiled))
+        PrintResult("               " + SizeAndTime(compiled));
     if (!text::EqualsIgnoringCase(compiled, copied))
         ShowFile("Copied to:     ", copied);
 }

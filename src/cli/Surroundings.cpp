@@ -8,7 +8,6 @@
 #include "platform/Interrupt.h"
 #include "platform/text/Text.h"
 
-#include <algorithm>
 #include <cstdlib>
 #include <filesystem>
 #include <map>
@@ -70,18 +69,8 @@ fs::path FindInstallation(const fs::path& program) {
     return {};
 }
 
-bool IsOnPath(const std::string& name) {
-    const char* list = std::getenv("PATH");
-    const std::vector<std::string> folders = text::Split(list == nullptr ? "/usr/bin:/bin" : list, ":");
-    return std::any_of(folders.begin(), folders.end(), [&](const std::string& folder) {
-        return access((folder + "/" + name).c_str(), X_OK) == 0;
-    });
-}
-
-/// Folder of the compiler's front; nothing when the compiler behind it isn't installed.
+/// Folder of the help compiler; nothing when it isn't installed.
 fs::path FindCompiler(const fs::path& program) {
-    if (!IsOnPath("chmcmd"))
-        return {};
     for (const fs::path& folder :
          {program / "tools", program / "../lib/tovimar", fs::path("/usr/lib/tovimar")})
         if (access((folder / "hhc.exe").c_str(), X_OK) == 0)

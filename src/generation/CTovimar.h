@@ -92,6 +92,7 @@ public:
     /// What the help compiler of the last run printed, and its exit code; empty and 0 when it didn't run.
     std::string CompilerOutput;
     int CompilerExitCode = 0;
+    double CompilerSeconds = 0;
 
     /// Once only: ends the help context ids and the tree.
     void Terminate();

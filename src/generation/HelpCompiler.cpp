@@ -13,8 +13,12 @@
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
+#include <cmath>
+
 namespace tovimar {
 namespace {
+
+constexpr double kSecondsOfDay = 86400;
 
 /// What a compiler leaves that was ended in its work: a file that is cut and its working copy of the project.
 void RemoveLeavings(const CAddInProject& project) {
@@ -38,6 +42,7 @@ void RunHelpCompiler(const std::string& commandLine, const CAddInProject& projec
     if (generator != nullptr && generator->CompilerStarted)
         generator->CompilerStarted();
     platform::Processes::Outcome outcome;
+    const double start = platform::Env().clock->Timer();
     try {
         outcome = platform::Env().processes->RunAndWait(commandLine);
     } catch (const RaisedError&) {
@@ -48,6 +53,9 @@ void RunHelpCompiler(const std::string& commandLine, const CAddInProject& projec
     if (generator != nullptr) {
         generator->CompilerOutput = outcome.output;
         generator->CompilerExitCode = outcome.exitCode;
+        // The timer starts again at midnight.
+        generator->CompilerSeconds =
+            std::fmod(platform::Env().clock->Timer() - start + kSecondsOfDay, kSecondsOfDay);
     }
 }
 

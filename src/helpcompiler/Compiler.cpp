@@ -53,6 +53,7 @@ public:
         }
         project_.help.contents = TakeSitemap(project_.contentsFile, project_.help.contentsFile);
         project_.help.index = TakeSitemap(project_.indexFile, project_.help.indexFile);
+        TakeStopList();
         FindDefaultTopic();
         CheckTargets(project_.help.contents, project_.contentsFile);
         CheckTargets(project_.help.index, project_.indexFile);
@@ -67,6 +68,9 @@ public:
 private:
     void Complain(const std::string& text) {
         tell_({Message::Kind::Complaint, path_.filename().string(), 0, text});
+    }
+    void Warn(const std::string& text) {
+        tell_({Message::Kind::Warning, path_.filename().string(), 0, text});
     }
 
     void Queue(const std::string& name) {
@@ -104,6 +108,23 @@ private:
         return map;
     }
 
+    /// Words that are too common to be looked for, one a line.
+    void TakeStopList() {
+        if (project_.stopListFile.empty())
+            return;
+        const auto found = folder_.Find(project_.stopListFile);
+        if (!found) {
+            Complain("'" + project_.stopListFile + "' is in the project but not on the disk");
+            return;
+        }
+        std::unordered_set<std::string> words;
+        SplitWords(ReadWhole(folder_.PathOf(*found)), page_.Number(), [&](std::string_view word) {
+            if (words.emplace(word).second)
+                project_.help.stopWords.emplace_back(word);
+        });
+        search_.SetStopWords(std::move(words));
+    }
+
     void FindDefaultTopic() {
         std::string& topic = project_.help.defaultTopic;
         if (const auto found = folder_.Find(page_.Decode(topic)))
@@ -124,11 +145,11 @@ private:
             const std::string name = page_.Decode(context.target.substr(0, context.target.find('#')));
             const auto found = folder_.Find(name);
             if (!found) {
-                Complain("'" + name + "' has a number but isn't on the disk");
+                Warn("'" + name + "' has a number but isn't on the disk");
                 continue;
             }
             if (!ids.insert(context.id).second)
-                Complain("the number " + std::to_string(context.id) + " stands for two pages");
+                Warn("the number " + std::to_string(context.id) + " stands for two pages");
             Queue(*found);
             good.push_back(
                 {context.id, page_.Encode(*found) + context.target.substr(std::min(context.target.find('#'),

@@ -50,8 +50,8 @@ struct HelpDescription {
     std::vector<WindowDefinition> windows;
     std::vector<ContextTarget> contexts;
     std::vector<std::string> mergedFiles;
-    std::vector<std::string> stopWords;
-    std::vector<Topic> pages; ///< the pages of the archive in the order of the project
+    std::vector<std::string> stopWords; ///< folded
+    std::vector<Topic> pages;           ///< the pages of the archive in the order of the project
     Sitemap contents, index;
 };
 

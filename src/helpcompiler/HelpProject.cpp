@@ -66,6 +66,7 @@ public:
     HelpProject Read(std::string_view bytes) {
         const std::uint32_t language = LanguageIn(bytes);
         project_.help.language = language;
+        project_.help.binaryIndex = true; // unless the project says No
         project_.help.codePage = CodePageOfLanguage(language);
         page_.emplace(project_.help.codePage);
         std::istringstream lines(Text(bytes));
@@ -78,7 +79,7 @@ public:
     }
 
 private:
-    void Complain(const std::string& text) { tell_({Message::Kind::Complaint, name_, line_, text}); }
+    void Warn(const std::string& text) { tell_({Message::Kind::Warning, name_, line_, text}); }
 
     std::string Text(std::string_view bytes) const {
         if (auto marked = text::DecodeMarked(bytes))
@@ -137,7 +138,7 @@ private:
         if (!alias)
             return;
         if (!aliases_.try_emplace(alias->name, alias->value).second)
-            Complain("the alias " + alias->name + " stands twice");
+            Warn("the alias " + alias->name + " stands twice");
     }
 
     /// "#define IDH_ORDERS 20", or an included file of such lines.
@@ -164,7 +165,7 @@ private:
     void Include(const std::string& name, int depth) {
         const auto found = folder_.Find(name);
         if (!found || depth == kDeepestInclude) {
-            tell_({Message::Kind::Warning, name_, line_, "'" + name + "' isn't on the disk"});
+            Warn("'" + name + "' isn't on the disk");
             return;
         }
         std::istringstream lines(

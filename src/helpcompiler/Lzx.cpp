@@ -5,6 +5,7 @@
 #include "helpcompiler/LzxParser.h"
 
 #include <algorithm>
+#include <cmath>
 #include <span>
 #include <vector>
 
@@ -209,9 +210,24 @@ LzxInterval Stored(std::string_view input) {
     return result;
 }
 
+/// True for bytes as evenly spread as those of pictures, which are compressed already: not worth a try.
+bool IsDense(std::string_view input) {
+    constexpr double kDenseBits = 7.93; // of the eight of a byte
+    std::array<std::uint32_t, 256> counts{};
+    for (const char byte : input)
+        ++counts[static_cast<unsigned char>(byte)];
+    double bits = 0;
+    for (const std::uint32_t count : counts)
+        if (count > 0)
+            bits += count * std::log2(static_cast<double>(input.size()) / count);
+    return bits > kDenseBits * static_cast<double>(input.size());
+}
+
 } // namespace
 
 LzxInterval CompressInterval(std::string_view input) {
+    if (IsDense(input))
+        return Stored(input);
     LzxInterval packed = Encoder(input).Encode();
     return packed.bytes.size() < input.size() ? packed : Stored(input);
 }

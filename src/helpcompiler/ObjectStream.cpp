@@ -1,9 +1,6 @@
 #include "helpcompiler/Bytes.h"
 #include "helpcompiler/InternalFiles.h"
 #include "helpcompiler/WordTable.h"
-#include "platform/text/Caseless.h"
-
-#include <algorithm>
 
 /// The stream that tells the viewer how words are split and folded: the table of bytes, the words that aren't
 /// stored and, for English, the stemmer.
@@ -32,8 +29,7 @@ void PutByteTable(std::string& out) {
 
 void PutStopWords(std::string& out, const std::vector<std::string>& words) {
     std::string list;
-    for (std::string word : words) {
-        std::transform(word.begin(), word.end(), word.begin(), text::CaselessAscii);
+    for (const std::string& word : words) {
         PutU16(list, static_cast<std::uint32_t>(word.size()));
         list += word;
     }

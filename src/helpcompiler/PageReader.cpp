@@ -109,9 +109,6 @@ private:
         if (const std::string_view style = token.Attribute("style"); !style.empty())
             for (PageReference& reference : ReadStyleSheet(style, scanner_.LineOf(token.source)))
                 content_.references.push_back(std::move(reference));
-        AddAnchor(token.Attribute("id"));
-        if (token.name == "a")
-            AddAnchor(token.Attribute("name"));
     }
 
     static bool IsNeededLink(std::string_view relation) {
@@ -124,11 +121,6 @@ private:
         if (!trimmed.empty())
             content_.references.push_back(
                 {kind, DecodeReferences(trimmed, page_, Unheld::Keep), scanner_.LineOf(token.source)});
-    }
-
-    void AddAnchor(std::string_view name) {
-        if (!name.empty())
-            content_.anchors.push_back(DecodeReferences(name, page_, Unheld::Keep));
     }
 
     MarkupScanner scanner_;

@@ -24,7 +24,6 @@ struct PageContent {
     std::string title; ///< in one line; empty without one
     PageWords words;
     std::vector<PageReference> references;
-    std::vector<std::string> anchors; ///< names that a link's "#..." can give
 };
 
 /// What the help compiler needs of a page, whose bytes are of the code page already. Anything can be read.

@@ -66,16 +66,16 @@ public:
 private:
     void PutBits(std::uint32_t bits, unsigned count) {
         while (count-- > 0) {
-            byte_ = static_cast<unsigned char>(byte_ << 1 | (bits >> count & 1U));
+            byte_ = byte_ << 1U | (bits >> count & 1U);
             if (++count_ == 8) {
-                out_.push_back(static_cast<char>(byte_));
+                out_.push_back(static_cast<char>(byte_ & 0xFFU));
                 count_ = 0;
             }
         }
     }
 
     std::string& out_;
-    unsigned char byte_ = 0;
+    unsigned byte_ = 0;
     unsigned count_ = 0;
 };
 
@@ -110,13 +110,16 @@ void SearchIndex::Add(std::uint32_t topic, const PageWords& words) {
         return;
     pages_.push_back({topic, tokens_.size()});
     std::uint32_t place = 0;
-    for (std::size_t from = 0; from < words.text.size(); ++place) {
+    std::uint32_t position = 0;
+    for (std::size_t from = 0; from < words.text.size(); ++position) {
         const std::size_t end = words.text.find('\0', from);
-        const std::uint32_t number = NumberOf(std::string_view(words.text).substr(from, end - from));
-        tokens_.push_back({number * 2 + (place < words.titleWords ? 1 : 0), place});
+        const auto word = std::string_view(words.text).substr(from, end - from);
         from = end + 1;
+        if (!stopWords_.empty() && stopWords_.contains(std::string(word)))
+            continue;
+        tokens_.push_back({NumberOf(word) * 2 + (position < words.titleWords ? 1 : 0), place});
+        highestPlace_ = std::max(highestPlace_, place++);
     }
-    highestPlace_ = std::max(highestPlace_, place - 1);
     mostCharacters_ = std::max(mostCharacters_, words.characters);
 }
 

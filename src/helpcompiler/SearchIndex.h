@@ -4,6 +4,8 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <unordered_set>
+#include <utility>
 #include <vector>
 
 namespace tovimar::helpcompiler {
@@ -20,6 +22,8 @@ struct PageWords {
 /// one and keeps eight bytes per word of text.
 class SearchIndex {
 public:
+    /// Words, folded, that are left out and take no place. Given before the first page.
+    void SetStopWords(std::unordered_set<std::string> words) { stopWords_ = std::move(words); }
     /// Pages come in the order of their topic numbers.
     void Add(std::uint32_t topic, const PageWords& words);
     bool IsEmpty() const { return tokens_.empty(); }
@@ -44,6 +48,7 @@ private:
     std::uint32_t NumberOf(std::string_view word);
 
     std::unordered_map<std::string, std::uint32_t, Hash, std::equal_to<>> numbers_;
+    std::unordered_set<std::string> stopWords_;
     std::vector<const std::string*> words_; ///< by number; keys of the map, which stay where they are
     std::vector<Token> tokens_;
     std::vector<Page> pages_;

@@ -21,7 +21,7 @@ constexpr const char* kPython = "/usr/bin/python3"; // the one that the library 
 class ChmReadersTest : public ProgramTest {
 protected:
     void SetUp() override {
-        for (const char* tool : {"chmcmd", "chmls", "7z", "extract_chmLib"})
+        for (const char* tool : {"chmls", "7z", "extract_chmLib"})
             if (!IsInstalled(tool))
                 GTEST_SKIP() << tool << " isn't installed; scripts/packages names its package";
         if (std::system((std::string(kPython) + " -c 'from chm import chm' 2>/dev/null").c_str()) != 0)
@@ -147,7 +147,7 @@ INSTANTIATE_TEST_SUITE_P(
                       Language{"RU", "utf-8", "cp1251", "0x419", "Обзор заказов", "Удалить"},
                       Language{"EL", "utf-8", "cp1253", "0x408", "Επισκόπηση", "Διαγραφή"}));
 
-/// The front beside the command, with what it sets right in the compiler's file.
+/// The help compiler beside the command.
 class ChmContainerTest : public ChmReadersTest {
 protected:
     void SetUp() override {

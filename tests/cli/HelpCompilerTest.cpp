@@ -47,7 +47,7 @@ TEST_F(HelpCompilerTest, AMissingFileIsAComplaintNotTheEnd) {
 TEST_F(HelpCompilerTest, TheOtherCompilerWorksWhereItIsAskedFor) {
     if (!IsInstalled("chmcmd"))
         GTEST_SKIP() << "chmcmd of the package fp-utils isn't installed";
-    variables["HELP_COMPILER"] = "chmcmd";
+    variables["TOVIMAR_HELP_COMPILER"] = "chmcmd";
     WriteProject("A.htm\r\nIMAGES\\pic.jpg\r\ngone.htm\r\n");
     Run({"my help/p.hhp"}).ExpectExit(1).ExpectErrorsHold("'gone.htm' is in the project but not on the disk");
     EXPECT_THAT(Made(), ::testing::ElementsAre("p.chm"));
@@ -70,7 +70,7 @@ TEST_F(HelpCompilerTest, KeepsTheOldFileWhenNothingIsCompiled) {
 TEST_F(HelpCompilerTest, NoProjectOrNoCompilerIsTold) {
     Run({"my help/none.hhp"}).ExpectExit(2);
     WriteProject("a.htm\r\n");
-    variables["HELP_COMPILER"] = "chmcmd";
+    variables["TOVIMAR_HELP_COMPILER"] = "chmcmd";
     searchPath = "/nowhere";
     Run({"my help/p.hhp"}).ExpectExit(2).ExpectErrorsHold("fp-utils");
     EXPECT_THAT(Made(), ::testing::IsEmpty());

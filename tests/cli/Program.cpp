@@ -10,6 +10,7 @@
 #include <fcntl.h>
 #include <fstream>
 #include <pty.h>
+#include <regex>
 #include <sstream>
 #include <sys/ioctl.h>
 #include <sys/wait.h>
@@ -188,6 +189,12 @@ Started ProgramTest::Start(const std::vector<std::string>& arguments, Errors err
     return run;
 }
 
+void ProgramTest::LeaveTheCompilerBehind() {
+    fs::copy_file(program, folder_ / "user/alone");
+    program = (folder_ / "user/alone").string();
+    variables["TOVIMAR_INSTALL"] = TOVIMAR_SOURCE_DIR "/install";
+}
+
 void ProgramTest::Write(const std::string& name, const std::string& bytes) const {
     const fs::path file = folder_ / name;
     fs::create_directories(file.parent_path());
@@ -204,6 +211,8 @@ fs::path ProgramTest::OwnInstallation() {
 std::string ProgramTest::WithPlaceholders(std::string text) const {
     text = text::ReplaceAll(text, folder_.string(), "<FOLDER>");
     text = text::ReplaceAll(text, TOVIMAR_SOURCE_DIR, "<SOURCE>");
+    static const std::regex kMeasured("[0-9.]+ MB, compiled in [0-9.]+ seconds");
+    text = std::regex_replace(text, kMeasured, "<SIZE> MB, compiled in <TIME> seconds");
     return text::ReplaceAll(text, VersionText(), "<VERSION>");
 }
 

@@ -61,6 +61,8 @@ protected:
 
     const fs::path& Folder() const { return folder_; }
     void Write(const std::string& name, const std::string& bytes) const;
+    /// From here on the command runs from a place that has no help compiler.
+    void LeaveTheCompilerBehind();
     std::string WithPlaceholders(std::string text) const;
     /// A copy of the installation for tests that change it; its folder.
     fs::path OwnInstallation();

@@ -1,5 +1,6 @@
 #include "helpcompiler/Container.h"
 #include "Tools.h"
+#include "helpcompiler/Lzx.h"
 
 #include <gtest/gtest.h>
 
@@ -30,7 +31,8 @@ std::string Filling(Kind kind, std::size_t size, unsigned seed) {
 
 } // namespace
 
-/// Each size in an archive of its own with others around it, read back by readers that share no code with us.
+/// Each size with others around it, those at the ends of frames alone too, read back by readers that share no
+/// code with us.
 TEST(ContainerTest, GivesBackWhatWentIn) {
     const Folder folder;
     std::vector<std::size_t> sizes{0,     1,     2,     3,     100,   32765, 32766,
@@ -42,11 +44,13 @@ TEST(ContainerTest, GivesBackWhatWentIn) {
         for (const std::size_t size : sizes) {
             const std::string bytes = Filling(kind, size, static_cast<unsigned>(size));
             all.Add("/" + std::to_string(size) + ".bin", bytes);
+            if (size % kLzxFrame > 2 && size % kLzxFrame < kLzxFrame - 3)
+                continue;
             Container alone(0x409, 0);
             alone.Add("/a.bin", bytes);
-            folder.Write("alone.chm", alone.Finish());
-            ASSERT_TRUE(folder.Run("7z t alone.chm")) << size << " " << static_cast<int>(kind);
+            folder.Write("alone" + std::to_string(size) + ".chm", alone.Finish());
         }
+        EXPECT_TRUE(folder.Run("7z t 'alone*.chm'")) << static_cast<int>(kind) << folder.Read("printed");
         folder.Write("all.chm", all.Finish());
         ASSERT_TRUE(folder.Run("rm -rf seven other && 7z x -oseven all.chm && extract_chmLib all.chm other"));
         for (const std::size_t size : sizes) {

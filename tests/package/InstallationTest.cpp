@@ -32,12 +32,8 @@ TEST_F(InstallationTest, RunsFromWhereverItsPrefixIsMoved) {
     RunFrom(prefix);
     const auto before = FilesBelow(prefix);
     const std::string sample = (prefix / "share/tovimar/samples/orchard").string();
-    std::vector<std::string> words{"generate", sample, "--output", "help", "--copy-to", "copy"};
-    const bool compiles = fs::exists("/usr/bin/chmcmd");
-    if (!compiles)
-        words.push_back("--no-compile");
-    Run(words).ExpectExit(0);
-    EXPECT_EQ(fs::exists(Folder() / "copy/orchard.chm"), compiles);
+    Run({"generate", sample, "--output", "help", "--copy-to", "copy"}).ExpectExit(0);
+    EXPECT_TRUE(fs::exists(Folder() / "copy/orchard.chm"));
     EXPECT_THAT(ReadWhole(Folder() / "help/ss.html"), HasSubstr("<title>"));
     EXPECT_TRUE(fs::exists(Folder() / "help/orchard_Form_Customers.htm"));
     EXPECT_EQ(FilesBelow(prefix), before) << "an installation isn't written to";

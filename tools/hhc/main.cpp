@@ -1,6 +1,6 @@
 /// `hhc.exe PROJECT.hhp`: the help compiler. The compiled file stands in the project's folder, or where the
-/// project says. With HELP_COMPILER=chmcmd in the environment the compiler of that name does the work.
-/// Exit code 0: compiled; 1: compiled with complaints, or not at all; 2: no project or no compiler.
+/// project says. With TOVIMAR_HELP_COMPILER=chmcmd in the environment the compiler of that name does the
+/// work. Exit code 0: compiled; 1: compiled with complaints, or not at all; 2: no project or no compiler.
 #include "ChmcmdCompiler.h"
 #include "helpcompiler/Compiler.h"
 #include "platform/Error.h"
@@ -48,7 +48,7 @@ int main(int count, char** arguments) {
         return hhc::Fail(2, "usage: hhc.exe PROJECT.hhp");
     try {
         const fs::path project = fs::absolute(arguments[1]);
-        const char* other = std::getenv("HELP_COMPILER");
+        const char* other = std::getenv("TOVIMAR_HELP_COMPILER");
         if (other != nullptr && std::strcmp(other, "chmcmd") == 0)
             return hhc::CompileWithChmcmd(project);
         if (!fs::is_regular_file(project))
