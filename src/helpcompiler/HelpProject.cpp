@@ -7,7 +7,6 @@
 #include "platform/text/ByteOrderMark.h"
 #include "platform/text/Text.h"
 
-#include <algorithm>
 #include <charconv>
 #include <fcntl.h>
 #include <map>
@@ -25,11 +24,6 @@ std::string Unquoted(std::string text) {
     if (text.size() >= 2 && (text.front() == '"' || text.front() == '<'))
         return text.substr(1, text.size() - 2);
     return text;
-}
-
-std::string WithSlashes(std::string name) {
-    std::replace(name.begin(), name.end(), '\\', '/');
-    return name;
 }
 
 bool IsYes(const std::string& value) {
@@ -164,7 +158,11 @@ private:
 
     void Include(const std::string& name, int depth) {
         const auto found = folder_.Find(name);
-        if (!found || depth == kDeepestInclude) {
+        if (depth == kDeepestInclude) {
+            Warn("'" + name + "' is included by files that include each other");
+            return;
+        }
+        if (!found) {
             Warn("'" + name + "' isn't on the disk");
             return;
         }

@@ -10,12 +10,6 @@ namespace tovimar::helpcompiler {
 namespace fs = std::filesystem;
 namespace {
 
-std::string WithSlashes(std::string_view name) {
-    std::string out(name);
-    std::replace(out.begin(), out.end(), '\\', '/');
-    return out;
-}
-
 int HexDigit(char c) {
     const char lower = text::CaselessAscii(c);
     if (c >= '0' && c <= '9')
@@ -47,6 +41,12 @@ bool HasScheme(std::string_view address) {
 }
 
 } // namespace
+
+std::string WithSlashes(std::string_view name) {
+    std::string out(name);
+    std::replace(out.begin(), out.end(), '\\', '/');
+    return out;
+}
 
 const ProjectFolder::Names& ProjectFolder::NamesIn(const fs::path& folder) {
     const auto [place, added] = listings_.try_emplace(folder.string());

@@ -32,6 +32,9 @@ private:
 /// for a place of the page itself. `outside` tells of a file beyond the project's folder.
 std::optional<std::string> FileOfReference(std::string_view page, std::string_view target, bool& outside);
 
+/// A name with slashes in place of backslashes.
+std::string WithSlashes(std::string_view name);
+
 /// "htm" of "a/B.HTM"; empty without one.
 std::string LowerExtension(std::string_view name);
 

@@ -1,6 +1,7 @@
 #include "helpcompiler/Sitemap.h"
 
 #include "helpcompiler/Markup.h"
+#include "helpcompiler/ProjectFolder.h"
 
 #include <algorithm>
 
@@ -103,8 +104,7 @@ std::vector<SitemapTarget> TargetsOf(const SitemapEntry& entry) {
         if (EqualsCaseless(parameter.name, "Name")) {
             title = parameter.value;
         } else if (EqualsCaseless(parameter.name, "Local") && !parameter.value.empty()) {
-            targets.push_back({title, parameter.value});
-            std::replace(targets.back().url.begin(), targets.back().url.end(), '\\', '/');
+            targets.push_back({title, WithSlashes(parameter.value)});
         }
     }
     return targets;

@@ -1,5 +1,7 @@
 #include "helpcompiler/WindowLine.h"
 
+#include "helpcompiler/ProjectFolder.h"
+
 #include <algorithm>
 #include <charconv>
 #include <string>
@@ -36,11 +38,6 @@ WindowDefinition::Number NumberIn(std::string_view field) {
     return {negative ? 0U - number : number, true};
 }
 
-std::string FileIn(std::string field) {
-    std::replace(field.begin(), field.end(), '\\', '/');
-    return field;
-}
-
 void TakeRectangle(WindowDefinition& window, const std::string& field) {
     if (!field.starts_with('['))
         return;
@@ -61,11 +58,11 @@ std::optional<WindowDefinition> ParseWindowLine(std::string_view line) {
     WindowDefinition window;
     window.name = line.substr(0, line.find_last_not_of(" \t", sign - 1) + 1);
     window.caption = field(0);
-    window.contentsFile = FileIn(field(1));
-    window.indexFile = FileIn(field(2));
-    window.defaultTopic = FileIn(field(3));
-    window.home = FileIn(field(4));
-    window.jumpUrls = {FileIn(field(5)), FileIn(field(7))};
+    window.contentsFile = WithSlashes(field(1));
+    window.indexFile = WithSlashes(field(2));
+    window.defaultTopic = WithSlashes(field(3));
+    window.home = WithSlashes(field(4));
+    window.jumpUrls = {WithSlashes(field(5)), WithSlashes(field(7))};
     window.jumpTexts = {field(6), field(8)};
     window.paneStyle = NumberIn(field(9));
     window.navigationWidth = NumberIn(field(10));

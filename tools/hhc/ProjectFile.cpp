@@ -1,87 +1,29 @@
 #include "ProjectFile.h"
 
-#include <algorithm>
-#include <array>
-#include <cctype>
-#include <cerrno>
-#include <cstdlib>
+#include "helpcompiler/LanguageCodePage.h"
+#include "helpcompiler/ProjectFolder.h"
+#include "platform/text/Text.h"
+
 #include <fstream>
-#include <iconv.h>
-#include <map>
 #include <set>
 #include <sstream>
-#include <string_view>
 
 namespace hhc {
 namespace fs = std::filesystem;
+namespace text = tovimar::text;
+namespace helpcompiler = tovimar::helpcompiler;
 namespace {
-
-std::string Trimmed(std::string_view text) {
-    const auto first = text.find_first_not_of(" \t\r");
-    if (first == std::string_view::npos)
-        return {};
-    return std::string(text.substr(first, text.find_last_not_of(" \t\r") - first + 1));
-}
-
-std::string Lower(std::string text) {
-    std::transform(text.begin(), text.end(), text.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return text;
-}
-
-/// Null-terminated result of iconv, or nothing when the bytes don't fit the encoding.
-std::string Converted(const std::string& bytes, const char* encoding) {
-    const iconv_t converter = iconv_open("UTF-8", encoding);
-    if (converter == reinterpret_cast<iconv_t>(-1))
-        return {};
-    std::string result(bytes.size() * 4, '\0');
-    char* in = const_cast<char*>(bytes.data());
-    char* out = result.data();
-    std::size_t inLeft = bytes.size();
-    std::size_t outLeft = result.size();
-    const bool failed = iconv(converter, &in, &inLeft, &out, &outLeft) == static_cast<std::size_t>(-1);
-    iconv_close(converter);
-    result.resize(failed ? 0 : result.size() - outLeft);
-    return result;
-}
-
-/// ANSI code page of a language by the primary part of its identifier ("0x419" is Russian).
-const char* EncodingOfLanguage(const std::string& identifier) {
-    struct Entry {
-        unsigned primary;
-        const char* encoding;
-    };
-    constexpr std::array<Entry, 15> kTable{{{0x02, "CP1251"},
-                                            {0x05, "CP1250"},
-                                            {0x08, "CP1253"},
-                                            {0x0e, "CP1250"},
-                                            {0x15, "CP1250"},
-                                            {0x18, "CP1250"},
-                                            {0x19, "CP1251"},
-                                            {0x1a, "CP1250"},
-                                            {0x1b, "CP1250"},
-                                            {0x1f, "CP1254"},
-                                            {0x22, "CP1251"},
-                                            {0x23, "CP1251"},
-                                            {0x24, "CP1250"},
-                                            {0x25, "CP1257"},
-                                            {0x27, "CP1257"}}};
-    const auto primary = static_cast<unsigned>(std::strtoul(identifier.c_str(), nullptr, 16) & 0x3ffU);
-    for (const Entry& entry : kTable)
-        if (entry.primary == primary)
-            return entry.encoding;
-    return "CP1252";
-}
 
 class Translator {
 public:
-    Translator(const fs::path& path, const std::string& bytes) : path_(path), folder_(path.parent_path()) {
+    Translator(const fs::path& path, const std::string& bytes)
+        : path_(path), folder_(path.parent_path()), files_(folder_) {
         std::istringstream lines(bytes);
         for (std::string line; std::getline(lines, line);)
-            lines_.push_back(Trimmed(line));
+            lines_.push_back(text::TrimWhitespace(line));
         for (const std::string& line : lines_)
             if (const auto [key, value] = Split(line); key == "language")
-                encoding_ = EncodingOfLanguage(value);
+                page_ = text::CodePage(helpcompiler::CodePageOfLanguage(helpcompiler::LanguageOf(value)));
     }
 
     TranslatedProject Run() {
@@ -97,13 +39,13 @@ private:
         const auto sign = line.find('=');
         if (sign == std::string::npos)
             return {};
-        return {Lower(Trimmed(std::string_view(line).substr(0, sign))),
-                Trimmed(std::string_view(line).substr(sign + 1))};
+        return {text::ToLower(text::TrimWhitespace(line.substr(0, sign))),
+                text::TrimWhitespace(line.substr(sign + 1))};
     }
 
     void Append(const std::string& line) {
         if (line.starts_with('[')) {
-            section_ = Lower(line);
+            section_ = text::ToLower(line);
             Put(line);
         } else if (section_ == "[options]") {
             AppendOption(line);
@@ -122,7 +64,7 @@ private:
         const auto [key, value] = Split(line);
         const bool isInput = key == "contents file" || key == "index file";
         if (key == "compiled file") {
-            const std::string name = ToUtf8(Forward(value));
+            const std::string name = ToUtf8(helpcompiler::WithSlashes(value));
             result_.compiledFile = folder_ / name;
             Put("Compiled file=" + name);
         } else if (isInput || key == "default topic") {
@@ -138,10 +80,10 @@ private:
 
     void AppendAlias(const std::string& line) {
         const auto sign = line.find('=');
-        const std::string page = OnDisk(Trimmed(std::string_view(line).substr(sign + 1)));
+        const std::string page = OnDisk(text::TrimWhitespace(line.substr(sign + 1)));
         if (!Exists(page))
             return;
-        aliases_.insert(Trimmed(std::string_view(line).substr(0, sign)));
+        aliases_.insert(text::TrimWhitespace(line.substr(0, sign)));
         Put(line.substr(0, sign + 1) + page);
     }
 
@@ -152,9 +94,9 @@ private:
             AppendDefine(line);
             return;
         }
-        std::ifstream header(folder_ / OnDisk(Trimmed(std::string_view(line).substr(9))));
+        std::ifstream header(folder_ / OnDisk(text::TrimWhitespace(line.substr(9))));
         for (std::string define; std::getline(header, define);)
-            AppendDefine(Trimmed(define));
+            AppendDefine(text::TrimWhitespace(define));
     }
 
     void AppendDefine(const std::string& line) {
@@ -175,16 +117,8 @@ private:
             Put(name);
     }
 
-    static std::string Forward(std::string name) {
-        std::replace(name.begin(), name.end(), '\\', '/');
-        return name;
-    }
-
     std::string ToUtf8(const std::string& name) const {
-        const std::string same = Converted(name, "UTF-8");
-        if (!same.empty() || name.empty())
-            return same;
-        return Converted(name, encoding_);
+        return text::IsValidUtf8(name) ? name : page_.Decode(name);
     }
 
     bool Exists(const std::string& name) const {
@@ -192,27 +126,10 @@ private:
         return !name.empty() && fs::is_regular_file(folder_ / name, ignored);
     }
 
-    /// The name with the spelling of the disk, each part looked up without regard to case.
+    /// The name with the spelling of the disk.
     std::string OnDisk(const std::string& line) {
-        const std::string name = ToUtf8(Forward(line));
-        if (name.empty() || Exists(name))
-            return name;
-        fs::path found;
-        for (const fs::path& part : fs::path(name))
-            found /= InFolder(folder_ / found, part.string());
-        return found.string();
-    }
-
-    const std::string& InFolder(const fs::path& folder, const std::string& name) {
-        auto [place, added] = listings_.try_emplace(folder.string());
-        if (added) {
-            std::error_code error;
-            for (fs::directory_iterator entry(folder, error), end; !error && entry != end;
-                 entry.increment(error))
-                place->second.emplace(Lower(entry->path().filename().string()),
-                                      entry->path().filename().string());
-        }
-        return place->second.try_emplace(Lower(name), name).first->second;
+        const std::string name = ToUtf8(helpcompiler::WithSlashes(line));
+        return files_.Find(name).value_or(name);
     }
 
     void Put(const std::string& line) { result_.text += line + "\n"; }
@@ -220,9 +137,9 @@ private:
     fs::path path_;
     fs::path folder_;
     std::vector<std::string> lines_;
-    const char* encoding_ = "CP1252";
+    text::CodePage page_{1252};
+    helpcompiler::ProjectFolder files_;
     std::string section_;
-    std::map<std::string, std::map<std::string, std::string>> listings_;
     std::set<std::string> listed_;
     std::set<std::string> aliases_;
     TranslatedProject result_;
