@@ -28,7 +28,7 @@ std::string_view EntityOf(std::string_view text, std::size_t position, bool quot
     case '"':
         return quotes ? "&quot;" : "";
     case '\xC2':
-        return text.substr(position).starts_with("\xC2\xA0") ? "&nbsp;" : "";
+        return !quotes && text.substr(position).starts_with("\xC2\xA0") ? "&nbsp;" : "";
     default:
         return {};
     }
@@ -108,6 +108,10 @@ void HtmlWriter::WriteOther(const HtmlNode& node) {
         WriteText(node);
     else if (node.kind() == HtmlNode::Kind::Comment)
         out_.append("<!--").append(node.nodeValue()).append("-->");
+    // Line ends in front of the element HTML are no nodes.
+    const HtmlNode* parent = node.parentNode();
+    if (parent != nullptr && parent->kind() == HtmlNode::Kind::Document && node.nextSibling() != nullptr)
+        out_.append("\r\n");
 }
 
 void HtmlWriter::WriteText(const HtmlNode& node) {

@@ -25,7 +25,8 @@ private:
     std::string& out_;
 };
 
-/// "&", "<" and ">" as entities, and the blank that doesn't break; with `quotes` the double quote as well.
+/// "&", "<" and ">" as entities, and the blank that doesn't break; with `quotes`, which is for attributes,
+/// the double quote instead of that blank.
 void AppendEncoded(std::string& out, std::string_view text, bool quotes);
 
 } // namespace tovimar

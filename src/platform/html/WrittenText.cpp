@@ -31,7 +31,7 @@ bool IsSpace(char c) {
 
 bool IsWrittenAs(std::string_view text, std::string_view source) {
     if (source == text)
-        return source.find('<') == std::string_view::npos && source.find('&') == std::string_view::npos;
+        return source.find('<') == std::string_view::npos;
     std::size_t inText = 0;
     std::size_t inSource = 0;
     while (inSource < source.size()) {
