@@ -71,12 +71,9 @@ std::string Joined(std::string_view text) {
 bool EndsItsLine(const HtmlNode& node) {
     const HtmlNode* next = node.nextSibling();
     const HtmlNode* edge = next != nullptr ? next : node.parentNode();
+    if (next == nullptr && edge != nullptr && edge->Is("select"))
+        return true;
     return edge != nullptr && edge->IsElement() && IsBlockElement(edge->name());
-}
-
-/// The name under which an element is written: nothing can stand behind a PLAINTEXT.
-std::string_view WrittenName(const HtmlNode& node) {
-    return node.Is("plaintext") ? std::string_view("pre") : std::string_view(node.name());
 }
 
 } // namespace
@@ -219,7 +216,8 @@ bool CHtmlStringFormatter::MayBreak(const CHtmlStringBuilder& sb) const {
 }
 
 void CHtmlStringFormatter::NoteEdge(const HtmlNode& node) {
-    if (IsBlockElement(node.name()) || node.Is("br"))
+    const bool opensList = node.Is("select") && !closed_.contains(node.uniqueID());
+    if (IsBlockElement(node.name()) || node.Is("br") || opensList)
         atEdge_ = true;
     else if (ShowsByItself(node.name()))
         atEdge_ = false;

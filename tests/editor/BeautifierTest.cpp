@@ -146,6 +146,8 @@ TEST(BeautifierTest, FormsOfOldPages) {
     EXPECT_EQ("    <iframe src=\"a.htm\">a < b</iframe>", Body("<iframe src=a.htm>a < b</iframe>"));
     EXPECT_EQ("    <select>\r\n      <option>a</option>\r\n      <option>b</option>\r\n    </select>",
               Body("<select><option>a<option>b</select>"));
+    EXPECT_EQ("    <p>x<select>\r\n        y\r\n      </select> z</p>",
+              Body("<p>x<select> y </select> z</p>"));
 }
 
 TEST(BeautifierTest, DeepPagesAreWrittenInTimeAndRoom) {

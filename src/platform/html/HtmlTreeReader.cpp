@@ -124,6 +124,7 @@ void HtmlTreeReader::ReadDocument(HtmlNode& root) {
     if (parse.Output().document->v.document.has_doctype)
         AddDoctype(root);
     PutTailBehindBody();
+    CheckTexts(root);
 }
 
 void HtmlTreeReader::ReadFragment(HtmlNode& parent, const HtmlNode& context) {
@@ -136,6 +137,7 @@ void HtmlTreeReader::ReadFragment(HtmlNode& parent, const HtmlNode& context) {
         tag = GUMBO_TAG_DIV;
     const Parse parse(source_, tag, space);
     Copy(parse.Output().root, parent);
+    CheckTexts(parent);
 }
 
 /// Parents are kept in a list instead of on the stack.
@@ -214,9 +216,24 @@ void HtmlTreeReader::FillText(HtmlNode& node, const void* parsed) {
     const char* start = node.source_.data();
     if (node.source_.starts_with('\n') && start != source_.data() && start[-1] == '\r')
         node.source_ = {start - 1, node.source_.size() + 1};
-    // The parser joins what stands on both sides of a tag that it drops.
-    if (NodeAt(parsed).type == GUMBO_NODE_CDATA || !IsWrittenAs(node.value_, node.source_))
+    if (NodeAt(parsed).type == GUMBO_NODE_CDATA)
         node.source_ = {};
+}
+
+/// The parser joins texts on both sides of a tag that it drops, and tells where they end by what comes next:
+/// only what reads as the text is how it was written.
+void HtmlTreeReader::CheckTexts(const HtmlNode& root) {
+    for (HtmlNode* node = root.NextWithin(root); node != nullptr; node = node->NextWithin(root)) {
+        if (!node->IsText())
+            continue;
+        const HtmlNode& parent = *node->parentNode();
+        const bool raw = parent.IsElement() && !parent.IsForeign() && IsRawTextElement(parent.name());
+        if (!raw)
+            node->source_ = node->source_.substr(0, node->source_.find('<'));
+        if (raw ? !IsTextWithLineEnds(node->value_, node->source_)
+                : !IsWrittenAs(node->value_, node->source_))
+            node->source_ = {};
+    }
 }
 
 /// The parser tells the parts of a document type but not how it was written.
@@ -271,7 +288,6 @@ std::string HtmlTreeReader::CutSpaces(HtmlNode& node, std::size_t most) {
     if (cut.empty())
         return cut;
     node.value_.resize(kept);
-    node.source_ = {};
     if (kept == 0)
         node.Detach();
     return cut;

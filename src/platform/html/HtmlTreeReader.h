@@ -29,6 +29,7 @@ private:
     void FillAttributes(HtmlNode& node, const void* parsed);
     void FillText(HtmlNode& node, const void* parsed);
     void AddDoctype(HtmlNode& root);
+    static void CheckTexts(const HtmlNode& root);
     void PutTailBehindBody();
     static std::string CutSpaces(HtmlNode& node, std::size_t most);
     std::string_view Checked(std::string_view part) const;

@@ -51,6 +51,17 @@ bool IsWrittenAs(std::string_view text, std::string_view source) {
     return inText == text.size();
 }
 
+bool IsTextWithLineEnds(std::string_view text, std::string_view source) {
+    std::size_t inText = 0;
+    for (std::size_t i = 0; i < source.size(); ++i) {
+        if (source[i] == '\r' && source.substr(i + 1).starts_with("\n"))
+            continue;
+        if (inText == text.size() || text[inText++] != (source[i] == '\r' ? '\n' : source[i]))
+            return false;
+    }
+    return inText == text.size();
+}
+
 std::size_t SpacesOutsideTags(std::string_view tail) {
     std::size_t spaces = 0;
     for (std::size_t i = 0; i < tail.size(); ++i) {

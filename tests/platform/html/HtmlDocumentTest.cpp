@@ -43,6 +43,9 @@ TEST(HtmlDocumentTest, LeftOutTagsAndLooseTextsArePutRight) {
     EXPECT_EQ("<b><i>x</i></b><i>y</i>", body("<b><i>x</b>y</i>"));
     EXPECT_EQ("<table><tbody><tr><td>x</td></tr></tbody></table>", body("<table><tr><td>x</table>"));
     EXPECT_EQ("<img src=\"a\">", body("<image src=\"a\">"));
+    EXPECT_EQ("x&copy;&#150;", body("<html><body>x&copy;&#150;</body></html>"));
+    EXPECT_EQ("<pre>a &lt;b&gt;</pre>", body("<plaintext>a <b>"));
+    EXPECT_EQ("&#144;b", body("&#144;</x>b"));
     EXPECT_EQ("", HtmlDocument("").body()->innerHTML());
     EXPECT_EQ("<html><head></head><body></body></html>", HtmlDocument().outerHTML());
 }
