@@ -22,6 +22,7 @@ struct Arguments {
         ListProjects,
         ForgetProject,
         Contents,
+        Tree,
         ListSettings,
         GetSetting,
         SetSetting,
@@ -51,6 +52,11 @@ struct Arguments {
     std::string settingName;
     std::string settingValue;
     bool all = false;
+    bool numbers = false; ///< of the entries of the contents
+    /// Of the command `tree`: the operations, with "then" between them, and what becomes of a deleted page.
+    std::vector<std::string> words;
+    enum class Pages { Ask, Keep, Delete };
+    Pages pages = Pages::Ask;
     bool open = false;
     bool compile = true;
     bool writeBack = false; ///< context ids go into the exports themselves

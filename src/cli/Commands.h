@@ -16,6 +16,7 @@ int Open(const Arguments& arguments, Surroundings& surroundings);
 int ListProjects(const Arguments& arguments);
 int ForgetProject(const Arguments& arguments, Surroundings& surroundings);
 int ShowContents(const Arguments& arguments, Surroundings& surroundings);
+int EditTree(const Arguments& arguments, Surroundings& surroundings);
 int ListSettings(const Arguments& arguments, Surroundings& surroundings);
 int GetSetting(const Arguments& arguments, Surroundings& surroundings);
 int SetSetting(const Arguments& arguments, Surroundings& surroundings);

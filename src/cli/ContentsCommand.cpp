@@ -6,6 +6,7 @@
 #include "cli/ProjectReading.h"
 #include "cli/Stop.h"
 #include "cli/Surroundings.h"
+#include "cli/TreeNodeNames.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
@@ -22,6 +23,7 @@ namespace {
 
 /// What is shown of a node, or of a control that an object's definition documents.
 struct Entry {
+    std::string number; ///< empty for a control
     std::string caption;
     std::string kind;
     std::string name;
@@ -45,7 +47,8 @@ void AddControls(const CHelpPrjTreeNode& node, Entry& entry) {
     if (form == nullptr)
         return;
     const auto add = [&](const CFormHTMLControlDef& control, const char* kind) {
-        entry.children.push_back({control.TopicCaption,
+        entry.children.push_back({{},
+                                  control.TopicCaption,
                                   kind,
                                   control.ControlName,
                                   entry.page + "#" + GetComponentAnchor(form->Name, control.ControlName),
@@ -59,24 +62,38 @@ void AddControls(const CHelpPrjTreeNode& node, Entry& entry) {
         add(*control, "control");
 }
 
-Entry Described(const CHelpPrjTreeNode& node, bool all) {
-    Entry entry{node.ContentsText(), Kind(node),     node.Name(), node.GeneratedHTMLFile(),
-                node.Key(),          node.Skipped(), {}};
+Entry Described(const CHelpPrjTreeNode& node, bool all, const std::string& number = "0") {
+    Entry entry{number,     node.ContentsText(), Kind(node), node.Name(), node.GeneratedHTMLFile(),
+                node.Key(), node.Skipped(),      {}};
     if (all && node.IsObjectNode())
         AddControls(node, entry);
-    for (const auto& child : node.Children())
-        if (!child->HasSerializer() && (all || !child->Skipped()))
-            entry.children.push_back(Described(*child, all));
+    std::size_t place = 0;
+    for (const auto& child : node.Children()) {
+        if (!HasNumber(*child))
+            continue;
+        ++place;
+        if (all || !child->Skipped())
+            entry.children.push_back(Described(*child, all, ChildNumber(number, place)));
+    }
     return entry;
 }
 
 nlohmann::ordered_json AsJson(const Entry& entry) {
-    nlohmann::ordered_json json{{"caption", entry.caption}, {"kind", entry.kind}, {"name", entry.name},
-                                {"page", entry.page},       {"key", entry.key},   {"skipped", entry.skipped}};
+    nlohmann::ordered_json json{{"number", entry.number},  {"caption", entry.caption}, {"kind", entry.kind},
+                                {"name", entry.name},      {"page", entry.page},       {"key", entry.key},
+                                {"skipped", entry.skipped}};
     auto& children = json["children"] = nlohmann::ordered_json::array();
     for (const Entry& child : entry.children)
         children.push_back(AsJson(child));
     return json;
+}
+
+/// The numbers stand in front of the captions.
+void TakeNumbers(Entry& entry) {
+    if (!entry.number.empty())
+        entry.caption = entry.number + "  " + entry.caption;
+    for (Entry& child : entry.children)
+        TakeNumbers(child);
 }
 
 std::size_t WidthOf(const Entry& entry, std::size_t indent) {
@@ -101,11 +118,13 @@ int Show(const Arguments& arguments) {
     CHelpPrjTree tree;
     if (tree.Load(file) != kSuccess || tree.Root() == nullptr)
         throw Stop{{}, kFailed};
-    const Entry root = Described(*tree.Root(), arguments.all);
+    Entry root = Described(*tree.Root(), arguments.all);
     std::string text;
     if (arguments.json)
         PrintJson(AsJson(root));
     else {
+        if (arguments.numbers)
+            TakeNumbers(root);
         AppendText(text, root, 0, WidthOf(root, 0));
         PrintResult(text);
     }

@@ -1,5 +1,6 @@
 #include "cli/Syntax.h"
 #include "cli/SyntaxWords.h"
+#include "cli/TreeSteps.h"
 
 namespace tovimar::cli {
 namespace {
@@ -41,7 +42,33 @@ void AddContents(CLI::App& app, Arguments& parsed) {
                                 Command::Contents, "tovimar contents shop-help --json");
     AddProject(*contents, parsed)->required();
     contents->add_flag("--all", parsed.all, "topics that are left out and the controls of forms, too");
+    contents->add_flag("--numbers", parsed.numbers,
+                       "a number before each entry, as \"tovimar tree\" takes it");
     AddJson(*contents, parsed);
+}
+
+void AddTree(CLI::App& app, Arguments& parsed) {
+    using Pages = Arguments::Pages;
+    auto* tree =
+        AddCommand(app, parsed, "tree", "rearrange the table of contents of a help", Command::Tree,
+                   "tovimar tree shop-help move Forms/Orders Basics then new Basics \"First steps\"");
+    AddProject(*tree, parsed)->required();
+    tree->add_option("OPERATION", parsed.words,
+                     "what to do, see below; without one the contents are shown with their numbers")
+        ->type_name("");
+    auto* keep = tree->add_flag_callback(
+        "--keep-page", [&parsed] { parsed.pages = Pages::Keep; }, "the pages of deleted entries stay");
+    tree->add_flag_callback(
+            "--delete-page", [&parsed] { parsed.pages = Pages::Delete; },
+            "the pages of deleted entries go with them")
+        ->excludes(keep);
+    AddYes(*tree, parsed);
+    AddJson(*tree, parsed);
+    tree->footer(TreeOperationsText() +
+                 "\nNODE and GROUP are entries: titles with slashes between them (Forms/Orders), a page\n"
+                 "(Orders.htm), or a number of \"tovimar contents --numbers\"; 0 is the project itself.\n"
+                 "All is saved behind the last operation, or nothing.\n\n" +
+                 tree->get_footer());
 }
 
 void AddSettings(CLI::App& app, Arguments& parsed) {
@@ -112,6 +139,7 @@ void AddProjectSyntax(CLI::App& app, Arguments& parsed) {
     AddOpen(app, parsed);
     AddProjects(app, parsed);
     AddContents(app, parsed);
+    AddTree(app, parsed);
     AddSettings(app, parsed);
 }
 

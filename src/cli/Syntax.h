@@ -12,7 +12,7 @@ struct Arguments;
 /// the one that was typed.
 void AddGenerationSyntax(CLI::App& app,
                          Arguments& parsed);             ///< new, generate, regenerate, recompile, screenshot
-void AddProjectSyntax(CLI::App& app, Arguments& parsed); ///< open, projects, contents, settings
+void AddProjectSyntax(CLI::App& app, Arguments& parsed); ///< open, projects, contents, tree, settings
 void AddSourceSyntax(CLI::App& app, Arguments& parsed);  ///< list, options, convert-contents
 
 } // namespace tovimar::cli

@@ -33,6 +33,8 @@ int RunCommand(const Arguments& arguments, Surroundings& surroundings) {
         return ForgetProject(arguments, surroundings);
     case Command::Contents:
         return ShowContents(arguments, surroundings);
+    case Command::Tree:
+        return EditTree(arguments, surroundings);
     case Command::ListSettings:
         return ListSettings(arguments, surroundings);
     case Command::GetSetting:

@@ -113,6 +113,14 @@ void CHelpPrjTree::DisplayInTreeview(ITreeView* rtvw, bool vfSkipSerializers) {
     });
 }
 
+void CHelpPrjTree::LeaveTreeview() {
+    TreeView = nullptr;
+    for (auto* node : map_) {
+        node->TreeView = nullptr;
+        node->TreeViewNode = nullptr;
+    }
+}
+
 void CHelpPrjTree::Collapse(ITreeViewNode* node) {
     if (auto* found = node == nullptr ? nullptr : MapItem(node->Key()))
         found->Collapse();

@@ -87,6 +87,8 @@ public:
 
     // View.
     void DisplayInTreeview(ITreeView* rtvw, bool vfSkipSerializers = false);
+    /// Nodes and view let go of each other; the view keeps its entries.
+    void LeaveTreeview();
     void Collapse(ITreeViewNode* node);
     void Expand(ITreeViewNode* node);
     bool KeyDown(std::int32_t& KeyCode, std::int32_t& Shift);

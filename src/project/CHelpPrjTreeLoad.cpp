@@ -50,6 +50,9 @@ struct CHelpPrjTree::LoadRun {
     std::string path;
     bool external = false;
     bool loadControls = false;
+    /// Part of a tree on its way to another place: all of it comes through, the groups of kinds that were left
+    /// out since, too.
+    bool piece = false;
     double buildTimeTotal = 0;
     double addControlsTimeTotal = 0;
     std::optional<bool> withoutQueries;
@@ -90,6 +93,7 @@ ResultCode CHelpPrjTree::Load(const std::string& vstrTreeDefFullPath, bool vfNew
             run.path = vstrTreeDefFullPath;
             run.external = vfLoadingExternalProject;
             run.loadControls = vfLoadControls;
+            run.piece = !vstrXml.empty();
             result = LoadTree(run, vstrXml);
         },
         [&] { return "TreeDefFullPath = " + vstrTreeDefFullPath; });
@@ -159,7 +163,7 @@ ResultCode CHelpPrjTree::BuildXmlNodes(LoadRun& run, std::int32_t level, const X
         run.addControlsTimeTotal += clock.Timer() - start;
     }
     for (auto child = element.firstChild(); child; child = child.nextSibling()) {
-        if (!child.IsElement() || run.LeavesOut(child.tagName()))
+        if (!child.IsElement() || (!run.piece && run.LeavesOut(child.tagName())))
             continue;
         const auto result = BuildXmlNodes(run, level + 1, child, node);
         if (result != kSuccess)

@@ -30,15 +30,14 @@ bool IsPreformattedElement(std::string_view name) {
 
 bool IsBlockElement(std::string_view name) {
     static const Names kNames{
-        "address",  "area",   "article",  "aside",      "base",      "blockquote", "body",     "caption",
-        "center",   "col",    "colgroup", "dd",         "details",   "dialog",     "dir",      "div",
-        "dl",       "dt",     "fieldset", "figcaption", "figure",    "footer",     "form",     "frame",
-        "frameset", "h1",     "h2",       "h3",         "h4",        "h5",         "h6",       "head",
-        "header",   "hgroup", "hr",       "html",       "isindex",   "legend",     "li",       "link",
-        "listing",  "main",   "map",      "menu",       "meta",      "nav",        "noframes", "ol",
-        "optgroup", "option", "p",        "param",      "plaintext", "pre",        "script",   "section",
-        "source",   "style",  "summary",  "table",      "tbody",     "td",         "template", "tfoot",
-        "th",       "thead",  "title",    "tr",         "track",     "ul",         "xmp"};
+        "address",  "article",    "aside",   "blockquote", "body",   "caption", "center",    "col",
+        "colgroup", "dd",         "details", "dialog",     "dir",    "div",     "dl",        "dt",
+        "fieldset", "figcaption", "figure",  "footer",     "form",   "frame",   "frameset",  "h1",
+        "h2",       "h3",         "h4",      "h5",         "h6",     "head",    "header",    "hgroup",
+        "hr",       "html",       "isindex", "legend",     "li",     "listing", "main",      "menu",
+        "nav",      "noframes",   "ol",      "optgroup",   "option", "p",       "plaintext", "pre",
+        "section",  "summary",    "table",   "tbody",      "td",     "tfoot",   "th",        "thead",
+        "title",    "tr",         "ul",      "xmp"};
     return kNames.contains(name);
 }
 

@@ -122,8 +122,11 @@ void HtmlNode::removeAttribute(std::string_view name) {
 
 HtmlNode& HtmlNode::insertBefore(HtmlNode& node, HtmlNode* reference) {
     bool impossible = node.document_ != document_ || (reference != nullptr && reference->parent_ != this) ||
-                      node.kind_ == Kind::Document || (kind_ != Kind::Element && kind_ != Kind::Document);
-    for (const HtmlNode* above = this; above != nullptr && !impossible; above = above->parent_)
+                      node.kind_ == Kind::Document || (kind_ != Kind::Element && kind_ != Kind::Document) ||
+                      &node == this;
+    // What holds nothing can't hold this node: deep trees are built without a walk up for each level.
+    const HtmlNode* above = node.firstChild_ == nullptr ? nullptr : parent_;
+    for (; above != nullptr && !impossible; above = above->parent_)
         impossible = above == &node;
     if (impossible)
         throw RaisedError(kGeneralFailure, "The node can't be put there", "HtmlNode");

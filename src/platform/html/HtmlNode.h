@@ -128,8 +128,7 @@ bool IsVoidElement(std::string_view name);
 bool IsRawTextElement(std::string_view name);
 /// Elements whose white space shows as it stands.
 bool IsPreformattedElement(std::string_view name);
-/// Elements that begin a line of their own when they are shown, or don't show: white space beside their
-/// tags means nothing.
+/// Elements that begin a line of their own when they are shown: white space beside their tags means nothing.
 bool IsBlockElement(std::string_view name);
 
 } // namespace tovimar

@@ -71,6 +71,13 @@ bool StartsTag(std::string_view tag, std::string_view opening, std::string_view 
            Lower(tag.substr(opening.size(), name.size())) == Lower(name);
 }
 
+/// Comments, and what browsers take for one: "<!" and "<?" with anything behind them.
+bool IsFinishedComment(std::string_view source) {
+    if (source.starts_with("<!--"))
+        return source.ends_with("-->");
+    return (source.starts_with("<!") || source.starts_with("<?")) && source.ends_with('>');
+}
+
 const GumboVector* ChildrenOf(const GumboNode& node) {
     switch (node.type) {
     case GUMBO_NODE_DOCUMENT:
@@ -116,7 +123,8 @@ void HtmlTreeReader::ReadDocument(HtmlNode& root) {
     Copy(parse.Output().document, root);
     if (parse.Output().document->v.document.has_doctype)
         AddDoctype(root);
-    PutTailBehindBody(root);
+    PutTailBehindBody();
+    CheckTexts(root);
 }
 
 void HtmlTreeReader::ReadFragment(HtmlNode& parent, const HtmlNode& context) {
@@ -129,6 +137,7 @@ void HtmlTreeReader::ReadFragment(HtmlNode& parent, const HtmlNode& context) {
         tag = GUMBO_TAG_DIV;
     const Parse parse(source_, tag, space);
     Copy(parse.Output().root, parent);
+    CheckTexts(parent);
 }
 
 /// Parents are kept in a list instead of on the stack.
@@ -159,7 +168,7 @@ HtmlNode& HtmlTreeReader::NodeOf(const void* parsed) {
         HtmlNode& node = document_.MakeNode(HtmlNode::Kind::Comment);
         node.value_ = from.v.text.text;
         node.source_ = Checked(Piece(from.v.text.original_text));
-        if (!node.source_.starts_with("<!--") || !node.source_.ends_with("-->"))
+        if (!IsFinishedComment(node.source_))
             node.source_ = {};
         return node;
     }
@@ -203,52 +212,85 @@ void HtmlTreeReader::FillText(HtmlNode& node, const void* parsed) {
     const GumboText& text = NodeAt(parsed).v.text;
     node.value_ = text.text;
     node.source_ = Checked(Piece(text.original_text));
-    // The parser joins what stands on both sides of a tag that it drops.
-    if (NodeAt(parsed).type == GUMBO_NODE_CDATA || !IsWrittenAs(node.value_, node.source_))
+    // A line end is one character for the parser, and its place that of the second.
+    const char* start = node.source_.data();
+    if (node.source_.starts_with('\n') && start != source_.data() && start[-1] == '\r')
+        node.source_ = {start - 1, node.source_.size() + 1};
+    if (NodeAt(parsed).type == GUMBO_NODE_CDATA)
         node.source_ = {};
+}
+
+/// The parser joins texts on both sides of a tag that it drops, and tells where they end by what comes next:
+/// only what reads as the text is how it was written.
+void HtmlTreeReader::CheckTexts(const HtmlNode& root) {
+    for (HtmlNode* node = root.NextWithin(root); node != nullptr; node = node->NextWithin(root)) {
+        if (!node->IsText())
+            continue;
+        const HtmlNode& parent = *node->parentNode();
+        const bool raw = parent.IsElement() && !parent.IsForeign() && IsRawTextElement(parent.name());
+        if (!raw)
+            node->source_ = node->source_.substr(0, node->source_.find('<'));
+        if (raw ? !IsTextWithLineEnds(node->value_, node->source_)
+                : !IsWrittenAs(node->value_, node->source_))
+            node->source_ = {};
+    }
 }
 
 /// The parser tells the parts of a document type but not how it was written.
 void HtmlTreeReader::AddDoctype(HtmlNode& root) {
     constexpr std::string_view kOpening = "<!doctype";
+    HtmlNode* behind = root.firstChild();
     std::size_t begin = source_.find('<');
-    while (begin != std::string_view::npos && Lower(source_.substr(begin, kOpening.size())) != kOpening)
-        begin = source_.substr(begin).starts_with("<!--") ? source_.find("-->", begin + 4)
-                                                          : source_.find('<', begin + 1);
+    while (begin != std::string_view::npos && Lower(source_.substr(begin, kOpening.size())) != kOpening) {
+        const bool comment = source_.substr(begin).starts_with("<!--");
+        begin = source_.find('<', comment ? source_.find("-->", begin + 2) : begin + 1);
+        if (behind != nullptr && behind->kind() == HtmlNode::Kind::Comment)
+            behind = behind->nextSibling();
+    }
     const std::size_t end = begin == std::string_view::npos ? begin : source_.find('>', begin);
     if (end == std::string_view::npos)
         return;
     HtmlNode& node = document_.MakeNode(HtmlNode::Kind::Doctype);
     node.source_ = source_.substr(begin, end + 1 - begin);
-    HtmlNode* behind = root.firstChild();
-    while (behind != nullptr && behind->kind() == HtmlNode::Kind::Comment &&
-           (behind->SourceStart().empty() || behind->SourceStart().data() < node.source_.data()))
-        behind = behind->nextSibling();
     root.Attach(node, behind);
 }
 
 /// The parser puts the line ends behind the body's end into the body: every saving of the page would add to
 /// it.
-void HtmlTreeReader::PutTailBehindBody(HtmlNode& root) {
+void HtmlTreeReader::PutTailBehindBody() {
     HtmlNode* body = document_.body();
-    if (body == nullptr || body->SourceEnd().empty() || body->lastChild() == nullptr ||
-        !body->lastChild()->IsText())
+    if (body == nullptr || body->SourceEnd().empty() || body->parentNode() == nullptr)
         return;
-    HtmlNode& last = *body->lastChild();
     const auto bodyEnd = static_cast<std::size_t>(body->SourceEnd().data() - source_.data());
-    const std::size_t spaces = SpacesOutsideTags(source_.substr(bodyEnd));
-    if (spaces == 0 || spaces > last.value_.size())
+    std::size_t spaces = SpacesOutsideTags(source_.substr(bodyEnd));
+    std::string tail;
+    // A comment between them makes them two texts.
+    while (spaces > 0 && body->lastChild() != nullptr && body->lastChild()->IsText()) {
+        const std::string cut = CutSpaces(*body->lastChild(), spaces);
+        if (cut.empty())
+            break;
+        spaces -= cut.size();
+        tail.insert(0, cut);
+    }
+    if (tail.empty())
         return;
-    const std::size_t kept = last.value_.size() - spaces;
-    if (last.value_.find_first_not_of(" \t\n\f", kept) != std::string::npos)
-        return;
-    HtmlNode& tail = document_.MakeNode(HtmlNode::Kind::Text);
-    tail.value_ = last.value_.substr(kept);
-    (body->parentNode() == nullptr ? root : *body->parentNode()).Attach(tail, body->nextSibling());
-    last.value_.resize(kept);
-    last.source_ = {};
+    HtmlNode& node = document_.MakeNode(HtmlNode::Kind::Text);
+    node.value_ = std::move(tail);
+    body->parentNode()->Attach(node, body->nextSibling());
+}
+
+/// Takes at most so many blanks off a text's end; a text that is left without any goes.
+std::string HtmlTreeReader::CutSpaces(HtmlNode& node, std::size_t most) {
+    const std::size_t shown = node.value_.find_last_not_of(" \t\n\f");
+    const std::size_t blank = shown == std::string::npos ? 0 : shown + 1;
+    const std::size_t kept = std::max(blank, node.value_.size() - std::min(most, node.value_.size()));
+    std::string cut = node.value_.substr(kept);
+    if (cut.empty())
+        return cut;
+    node.value_.resize(kept);
     if (kept == 0)
-        last.Detach();
+        node.Detach();
+    return cut;
 }
 
 } // namespace tovimar

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <string>
 #include <string_view>
 
 namespace tovimar {
@@ -28,7 +29,9 @@ private:
     void FillAttributes(HtmlNode& node, const void* parsed);
     void FillText(HtmlNode& node, const void* parsed);
     void AddDoctype(HtmlNode& root);
-    void PutTailBehindBody(HtmlNode& root);
+    static void CheckTexts(const HtmlNode& root);
+    void PutTailBehindBody();
+    static std::string CutSpaces(HtmlNode& node, std::size_t most);
     std::string_view Checked(std::string_view part) const;
 
     HtmlDocument& document_;

@@ -17,7 +17,17 @@ bool ClosesInStartTag(const HtmlNode& node) {
     return node.IsForeign() && node.firstChild() == nullptr && node.SourceStart().ends_with("/>");
 }
 
-std::string_view EntityOf(std::string_view text, std::size_t position, bool quotes) {
+/// Of a character whose first byte is 0xC2: U+0080 to U+00BF.
+std::string SecondControlOrBlank(std::string_view character, bool quotes) {
+    if (character.size() < 2)
+        return {};
+    const auto number = static_cast<unsigned char>(character[1]);
+    if (number < 0xA0)
+        return "&#" + std::to_string(number) + ";";
+    return number == 0xA0 && !quotes ? "&nbsp;" : "";
+}
+
+std::string EntityOf(std::string_view text, std::size_t position, bool quotes) {
     switch (text[position]) {
     case '&':
         return "&amp;";
@@ -28,7 +38,7 @@ std::string_view EntityOf(std::string_view text, std::size_t position, bool quot
     case '"':
         return quotes ? "&quot;" : "";
     case '\xC2':
-        return text.substr(position).starts_with("\xC2\xA0") ? "&nbsp;" : "";
+        return SecondControlOrBlank(text.substr(position, 2), quotes);
     default:
         return {};
     }
@@ -40,13 +50,17 @@ void AppendEncoded(std::string& out, std::string_view text, bool quotes) {
     std::size_t done = 0;
     for (std::size_t i = text.find_first_of("&<>\"\xC2"); i != std::string_view::npos;
          i = text.find_first_of("&<>\"\xC2", i + 1)) {
-        const std::string_view entity = EntityOf(text, i, quotes);
+        const std::string entity = EntityOf(text, i, quotes);
         if (entity.empty())
             continue;
         out.append(text, done, i - done).append(entity);
         done = i + (text[i] == '\xC2' ? 2 : 1);
     }
     out.append(text, done);
+}
+
+std::string_view WrittenName(const HtmlNode& node) {
+    return node.Is("plaintext") ? std::string_view("pre") : std::string_view(node.name());
 }
 
 void HtmlWriter::Write(const HtmlNode& node) {
@@ -79,10 +93,10 @@ void HtmlWriter::WriteStart(const HtmlNode& node) {
         WriteOther(node);
         return;
     }
-    if (!node.SourceStart().empty()) {
+    if (!node.SourceStart().empty() && !node.Is("plaintext")) {
         out_.append(node.SourceStart());
     } else {
-        out_.append("<").append(node.name());
+        out_.append("<").append(WrittenName(node));
         for (const HtmlAttribute& attribute : node.attributes()) {
             out_.append(" ").append(attribute.name);
             if (!attribute.text.empty()) {
@@ -102,18 +116,24 @@ void HtmlWriter::WriteStart(const HtmlNode& node) {
 void HtmlWriter::WriteOther(const HtmlNode& node) {
     if (node.kind() == HtmlNode::Kind::Document)
         return;
-    if (!node.SourceStart().empty())
+    const bool asWritten = node.parentNode() == nullptr || !node.parentNode()->Is("plaintext");
+    if (asWritten && !node.SourceStart().empty())
         out_.append(node.SourceStart());
     else if (node.IsText())
         WriteText(node);
     else if (node.kind() == HtmlNode::Kind::Comment)
         out_.append("<!--").append(node.nodeValue()).append("-->");
+    // Line ends in front of the element HTML are no nodes.
+    const HtmlNode* parent = node.parentNode();
+    if (parent != nullptr && parent->kind() == HtmlNode::Kind::Document && node.nextSibling() != nullptr)
+        out_.append("\r\n");
 }
 
 void HtmlWriter::WriteText(const HtmlNode& node) {
     const HtmlNode* parent = node.parentNode();
     std::string text;
-    if (parent != nullptr && !parent->IsForeign() && IsRawTextElement(parent->name()))
+    if (parent != nullptr && !parent->IsForeign() && IsRawTextElement(parent->name()) &&
+        !parent->Is("plaintext"))
         text = node.nodeValue();
     else
         AppendEncoded(text, node.nodeValue(), /*quotes=*/false);
@@ -130,7 +150,7 @@ void HtmlWriter::WriteEnd(const HtmlNode& node) {
     if (!node.SourceEnd().empty())
         out_.append(node.SourceEnd());
     else
-        out_.append("</").append(node.name()).append(">");
+        out_.append("</").append(WrittenName(node)).append(">");
 }
 
 std::string HtmlNode::outerHTML() const {

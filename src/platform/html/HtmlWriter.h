@@ -25,7 +25,12 @@ private:
     std::string& out_;
 };
 
-/// "&", "<" and ">" as entities, and the blank that doesn't break; with `quotes` the double quote as well.
+/// "&", "<" and ">" as entities, and the blank that doesn't break; with `quotes`, which is for attributes,
+/// the double quote instead of that blank. Control characters beyond ASCII, which readers take for faults, as
+/// numbers.
 void AppendEncoded(std::string& out, std::string_view text, bool quotes);
+
+/// The name under which an element is written: nothing can stand behind a PLAINTEXT.
+std::string_view WrittenName(const HtmlNode& node);
 
 } // namespace tovimar

@@ -31,7 +31,7 @@ bool IsSpace(char c) {
 
 bool IsWrittenAs(std::string_view text, std::string_view source) {
     if (source == text)
-        return source.find('<') == std::string_view::npos && source.find('&') == std::string_view::npos;
+        return source.find('<') == std::string_view::npos;
     std::size_t inText = 0;
     std::size_t inSource = 0;
     while (inSource < source.size()) {
@@ -47,6 +47,17 @@ bool IsWrittenAs(std::string_view text, std::string_view source) {
             return false;
         ++inText;
         ++inSource;
+    }
+    return inText == text.size();
+}
+
+bool IsTextWithLineEnds(std::string_view text, std::string_view source) {
+    std::size_t inText = 0;
+    for (std::size_t i = 0; i < source.size(); ++i) {
+        if (source[i] == '\r' && source.substr(i + 1).starts_with("\n"))
+            continue;
+        if (inText == text.size() || text[inText++] != (source[i] == '\r' ? '\n' : source[i]))
+            return false;
     }
     return inText == text.size();
 }
