@@ -25,9 +25,11 @@ TEST_F(CommandsTest, WhatTheyShow) {
         const char* golden;
         std::vector<std::string> arguments;
     };
-    const std::array<Shown, 16> all{{{"help.txt", {"--help"}},
+    const std::array<Shown, 18> all{{{"help.txt", {"--help"}},
                                      {"help-new.txt", {"new", "--help"}},
                                      {"help-generate.txt", {"generate", "--help"}},
+                                     {"help-regenerate.txt", {"regenerate", "--help"}},
+                                     {"help-tree.txt", {"tree", "--help"}},
                                      {"help-recompile.txt", {"recompile", "--help"}},
                                      {"help-screenshot.txt", {"screenshot", "--help"}},
                                      {"help-open.txt", {"open", "--help"}},
