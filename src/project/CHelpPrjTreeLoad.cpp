@@ -50,8 +50,8 @@ struct CHelpPrjTree::LoadRun {
     std::string path;
     bool external = false;
     bool loadControls = false;
-    /// Part of a tree on its way to another place: all of it comes through, the groups of kinds that were left
-    /// out since, too.
+    /// Part of a tree on its way to another place: all of it comes through, the groups of kinds that were
+    /// left out since, too.
     bool piece = false;
     double buildTimeTotal = 0;
     double addControlsTimeTotal = 0;

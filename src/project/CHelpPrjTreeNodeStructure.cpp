@@ -144,15 +144,14 @@ std::string KeyBase(std::string key) {
     return suffix == std::string::npos ? key : key.substr(0, suffix);
 }
 
-/// Two copies within a hundredth of a second wait for the clock to move. So do two nodes of one copy that were
-/// copies of one node before: the key must be free among the others of the piece, too.
+/// Two copies within a hundredth of a second wait for the clock to move. So do two nodes of one copy that
+/// were copies of one node before: the key must be free among the others of the piece, too.
 std::string FreeKey(const CHelpPrjTree& tree, const CHelpPrjTree* piece, const std::string& base) {
     constexpr double kLongestWait = 3;
     const auto start = platform::Env().clock->Timer();
     for (;;) {
         auto candidate = base + '_' + CHelpPrjTreeNode::GeneratedKeySuffix() + '_';
-        if (tree.MapItem(candidate) == nullptr &&
-            (piece == nullptr || piece->MapItem(candidate) == nullptr))
+        if (tree.MapItem(candidate) == nullptr && (piece == nullptr || piece->MapItem(candidate) == nullptr))
             return candidate;
         platform::Env().doEvents();
         const auto now = platform::Env().clock->Timer();

@@ -168,7 +168,7 @@ TEST_F(ProjectsTest, ContentsAsTextAndAsJson) {
     const json& forms = root["children"][0];
     EXPECT_EQ(forms["kind"], "group");
     ASSERT_EQ(forms["children"].size(), 1U);
-    EXPECT_EQ(forms["children"][0], (json{{"number", "1.1"},
+    EXPECT_EQ(forms["children"][0], (json{{"number", "1.2"},
                                           {"caption", "Orders"},
                                           {"kind", "form"},
                                           {"name", "Orders"},
