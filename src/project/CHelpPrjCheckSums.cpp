@@ -152,9 +152,21 @@ void CHelpPrjCheckSums::Terminate() {
 }
 
 std::string CheckSumOfBytes(std::string_view bytes) {
+    // A run looks at every page: sixteen bytes at a time, in sums of their own, go at the speed of memory.
+    constexpr std::size_t kLanes = 16;
+    const auto term = [&](std::size_t i) {
+        return static_cast<std::uint8_t>(static_cast<std::uint8_t>(bytes[i]) + static_cast<std::uint8_t>(i));
+    };
+    std::array<std::uint8_t, kLanes> lanes{};
+    std::size_t i = 0;
+    for (; i + kLanes <= bytes.size(); i += kLanes)
+        for (std::size_t lane = 0; lane < kLanes; ++lane)
+            lanes[lane] ^= term(i + lane);
+    for (; i < bytes.size(); ++i)
+        lanes[i % kLanes] ^= term(i);
     std::array<std::uint8_t, 4> sums{};
-    for (std::size_t i = 0; i < bytes.size(); ++i)
-        sums[i % 4] ^= static_cast<std::uint8_t>((static_cast<std::uint8_t>(bytes[i]) + i) & 0xFFU);
+    for (std::size_t lane = 0; lane < kLanes; ++lane)
+        sums[lane % sums.size()] ^= lanes[lane];
     constexpr const char* kDigits = "0123456789ABCDEF";
     std::string text;
     for (const auto sum : sums) {
