@@ -24,10 +24,9 @@ protected:
 TEST_F(TreeTest, OperationsAreSavedTogetherOrNotAtAll) {
     Run({"tree", "help", "move", "Forms/Orders", "Tables", "then", "new", "Forms", "First steps"})
         .ExpectExit(0);
-    EXPECT_THAT(
-        Contents(),
-        AllOf(HasSubstr("  Tables           Tables.htm\n    Orders         shop_Form_Orders.htm\n"),
-              HasSubstr("    First steps    First_steps.htm\n")));
+    EXPECT_THAT(Contents(),
+                AllOf(HasSubstr("  Tables           Tables.htm\n    Orders         shop_Form_Orders.htm\n"),
+                      HasSubstr("    First steps    First_steps.htm\n")));
     EXPECT_TRUE(fs::exists(Folder() / "help/First_steps.htm"));
     const auto before = ReadWhole(Folder() / "help/shop.tvp");
     Run({"tree", "help", "up", "Forms/First steps", "then", "left", "Nowhere"})

@@ -42,7 +42,12 @@ void LimitChild() {
     ::setrlimit(RLIMIT_CPU, &processor);
     const rlimit core{0, 0};
     ::setrlimit(RLIMIT_CORE, &core);
-#if !defined(__SANITIZE_ADDRESS__)
+#if defined(__has_feature)
+#define TOVIMAR_HAS_FEATURE(name) __has_feature(name)
+#else
+#define TOVIMAR_HAS_FEATURE(name) 0
+#endif
+#if !defined(__SANITIZE_ADDRESS__) && !TOVIMAR_HAS_FEATURE(address_sanitizer)
     // The sanitizer's own address space is larger than any limit.
     const rlimit memory{rlim_t{4} << 30, rlim_t{4} << 30};
     ::setrlimit(RLIMIT_AS, &memory);
