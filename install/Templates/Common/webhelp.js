@@ -29,7 +29,7 @@
 
   function noteShown(href, title) {
     const page = pageOf(href);
-    if (page === null || page === shown && search.state !== "loading") return;
+    if (page === null || page === shown && !search.awaited) return;
     shown = page;
     frame.title = title || "Topic";
     document.title = title && title !== helpTitle ? title + " \u2013 " + helpTitle : helpTitle;
@@ -43,9 +43,11 @@
 
   addEventListener("message", event => {
     const message = event.data;
-    if (event.source !== frame.contentWindow || !message) return;
+    if (!message) return;
+    // The search page says this as it leaves; by then its window may be gone and the message without a source.
+    if (message.tovimar === "found" && (event.source === null || event.source === frame.contentWindow)) search.found = message.words;
+    if (event.source !== frame.contentWindow) return;
     if (message.tovimar === "page") noteShown(String(message.href), String(message.title));
-    if (message.tovimar === "found") search.found = message.words;
     if (message.tovimar === "key" && message.key === "/") search.focus();
     if (message.tovimar === "key" && message.key === "Escape") panel.closeOverlay();
   });
@@ -117,8 +119,12 @@
     },
     select(page) {
       const link = this.linkTo(page);
-      if (link) this.mark(link);
-      else if (this.current) this.current.removeAttribute("aria-current");
+      // An entry that was clicked is marked already; what has been closed since stays closed.
+      if (link && link !== this.current) this.mark(link);
+      else if (!link && this.current) {
+        this.current.removeAttribute("aria-current");
+        this.current = null;
+      }
     },
     mark(link) {
       if (this.current) this.current.removeAttribute("aria-current");
@@ -306,13 +312,15 @@
 
   // ---- Search. The search page shows its results in the topic's place, and is told each keystroke.
   const search = {
-    field: byId("query"), state: "", before: "", found: null, focusResults: false,
+    // Awaited is the page from the asking to its arrival, whatever topic still comes in between.
+    field: byId("query"), state: "", awaited: false, before: "", found: null, focusResults: false,
 
     type() {
       const text = this.field.value;
       if (this.state === "shown") this.send();
       else if (this.state === "" && text.trim()) {
         this.state = "loading";
+        this.awaited = true;
         this.before = shown;
         show(SEARCH_PAGE + "#q=" + encodeURIComponent(text));
         panel.closeOverlay();
@@ -327,11 +335,12 @@
         this.found = null;
         return;
       }
-      if (this.state === "loading") this.send();
-      else {
+      if (this.awaited) this.send();
+      else if (this.state !== "shown") {
         const asked = /#q=(.*)/.exec(shown);
         this.field.value = asked ? plain(asked[1]) : "";
       }
+      this.awaited = false;
       this.state = "shown";
       if (this.focusResults) this.toResults();
     },
@@ -346,6 +355,7 @@
       this.field.value = "";
       if (this.state) show(this.before || start);
       this.state = "";
+      this.awaited = false;
     },
     focus() {
       focus();
