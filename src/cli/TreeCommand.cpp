@@ -107,8 +107,9 @@ private:
     const Arguments& arguments_;
     std::vector<TreeStep> steps_;
     std::string file_;
-    ProjectReading reading_;
+    /// Before the reading: the tree that this frees takes its nodes from the view.
     ListTreeView view_;
+    ProjectReading reading_;
     clsTreeViewManipulator manipulator_;
     nlohmann::ordered_json results_ = nlohmann::ordered_json::array();
     std::vector<std::string> shownEntries_;
