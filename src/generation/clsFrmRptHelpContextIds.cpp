@@ -141,17 +141,20 @@ void clsFrmRptHelpContextIds::AssignHelpContextIdsForForm(const std::string& nam
         const auto form = Definitions().Load(path);
         if (form == nullptr)
             return;
-        form->NewHelpContextIdsCount = 0;
+        // A definition is written again for a new number only: kept objects keep theirs to the byte.
+        newIds_ = 0;
         if (IsWithoutId(form->HelpContextId, name, {}) && !IsWithoutOwnId(*form)) {
-            form->HelpContextId = IdFor(name, {});
-            form->NewHelpContextIdsCount = 1;
+            Assign(form->HelpContextId, name, {});
+            numbered_.insert(name);
         }
+        form->NewHelpContextIdsCount = numbered_.contains(name) ? 1 : 0;
         for (const auto& control : form->Controls) {
             if (IsWithoutId(control->HelpContextId, name, control->Name))
-                control->HelpContextId = IdFor(name, control->Name);
+                Assign(control->HelpContextId, name, control->Name);
             AssignHelpContextIdsForSubControls(name, *control);
         }
-        Definitions().Save(form, path);
+        if (newIds_ > 0)
+            Definitions().Save(form, path);
     });
 }
 
@@ -161,9 +164,14 @@ void clsFrmRptHelpContextIds::AssignHelpContextIdsForSubControls(const std::stri
         for (const auto& child : control.Controls) {
             const std::string owner = OwnerOf(control, *child);
             if (child->HelpContextId < 1 || IsWithoutId(child->HelpContextId, form, owner))
-                child->HelpContextId = IdFor(form, owner);
+                Assign(child->HelpContextId, form, owner);
         }
     });
+}
+
+void clsFrmRptHelpContextIds::Assign(std::int32_t& id, const std::string& form, const std::string& owner) {
+    id = IdFor(form, owner);
+    ++newIds_;
 }
 
 void clsFrmRptHelpContextIds::RecallEarlierIds(CXmlForm& rxmlForm) {
@@ -226,7 +234,7 @@ std::string clsFrmRptHelpContextIds::SetHelpContextIdsForForm(const std::string&
         if (form == nullptr || form->HelpContextId < 1)
             return;
         const std::int32_t type = form->Type_() == "Report" ? ObjectType::kReport : ObjectType::kForm;
-        if (form->NewHelpContextIdsCount >= 1 && Session::Parameters()->SaveApplicationChanges &&
+        if (numbered_.contains(name) && Session::Parameters()->SaveApplicationChanges &&
             !SourceIs(SourceProjectKind::kAspNet) && HasHelpProperties(*form))
             WriteIdIntoSource(*form, type);
         line = DefineLine(name, form->HelpContextId);

@@ -48,6 +48,7 @@ private:
     std::int32_t IdFor(const std::string& form, const std::string& control);
     void AssignHelpContextIdsForForm(const std::string& name);
     void AssignHelpContextIdsForSubControls(const std::string& form, CXmlControl& control);
+    void Assign(std::int32_t& id, const std::string& form, const std::string& owner);
     std::string SetHelpContextIdsForForm(const std::string& name);
     std::string DefinitionPath(const std::string& name) const;
     void WriteIncludeFile(std::string text);
@@ -56,6 +57,8 @@ private:
     KeyedList<std::int32_t> usedIds_;
     std::vector<std::string> duplicates_;
     EarlierContextIds earlier_;
+    std::int32_t newIds_ = 0;                  ///< given out for the form at hand
+    std::unordered_set<std::string> numbered_; ///< forms whose own number is of this run
     std::unordered_set<std::string> recalled_; ///< owners whose number isn't confirmed yet
     std::int32_t lastId_ = 0;
 };

@@ -96,6 +96,14 @@ protected:
             pages[name] = Page(name);
         return pages;
     }
+    /// Bytes of all pictures and definitions, by their place in the help folder.
+    std::map<std::string, std::string> PicturesAndDefinitions() {
+        std::map<std::string, std::string> files;
+        for (const std::string folder : {"images\\", "xml\\"})
+            for (const auto& name : environment->files->ListFiles(Path("help\\" + folder), "*"))
+                files[folder + name] = Page(folder + name);
+        return files;
+    }
     static std::string Names(const std::vector<RegenerationReport::Object>& objects) {
         std::string names;
         for (const auto& object : objects)
@@ -245,6 +253,14 @@ TEST_F(RegenerateTest, WhatTheWriterLeftOutStaysOut) {
 /// What a writer and a developer do between two regenerations, drawn from a seed.
 class RandomLives : public RegenerateTest, public ::testing::WithParamInterface<unsigned> {
 protected:
+    /// A paragraph of the writer's in a list page; the page itself is written again with each new line.
+    void EditAList(const char* list, int number) {
+        auto text = Page(list);
+        paragraphs_.push_back("Ours &amp; " + std::to_string(number) + " <b>bold</b>");
+        text.insert(text.find('>', text.find("<body")) + 1, "<p>" + paragraphs_.back() + "</p>");
+        WriteFile("help\\" + std::string(list), text);
+        lists_.emplace_back(list);
+    }
     /// Edits that stand in no template, at places between tags.
     void EditAPage(std::mt19937& random, std::map<std::string, std::string>& pages) {
         auto page = pages.begin();
@@ -277,6 +293,7 @@ protected:
     }
 
     std::vector<std::string> objects_;
+    std::vector<std::string> lists_, paragraphs_; ///< in step
     std::set<std::string> added_;
     int last_ = 0;
 };
@@ -298,6 +315,9 @@ TEST_P(RandomLives, EveryEditedCharacterIsFoundAgain) {
         std::erase_if(pages, [](const auto& page) { return IsMadeAgain(page.first); });
         for (auto edits = random() % 4; edits > 0; --edits)
             EditAPage(random, pages);
+        if (random() % 8 == 0)
+            EditAList(random() % 2 == 0 ? "Forms.htm" : "Reports.htm", life);
+        const auto made = PicturesAndDefinitions();
         added_.clear();
         for (auto changes = random() % 3; changes > 0; --changes)
             ChangeTheApplication(random);
@@ -306,6 +326,10 @@ TEST_P(RandomLives, EveryEditedCharacterIsFoundAgain) {
         ASSERT_EQ(report.added.size(), added_.size()) << "life " << life;
         for (const auto& [name, bytes] : pages)
             ASSERT_EQ(Page(name), bytes) << name << " in life " << life;
+        for (const auto& [name, bytes] : made)
+            ASSERT_EQ(Page(name), bytes) << name << " in life " << life;
+        for (std::size_t i = 0; i < lists_.size(); ++i)
+            ASSERT_THAT(Page(lists_[i]), HasSubstr(paragraphs_[i])) << "life " << life;
         for (const auto& object : report.added)
             ASSERT_TRUE(added_.contains(object.name) && Exists(object.page)) << object.page;
         const auto ids = ContextIds();
