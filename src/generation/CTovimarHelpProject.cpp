@@ -9,6 +9,7 @@
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
+#include "project/BackupPages.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
 
@@ -27,9 +28,11 @@ bool IsWebHelpPage(const std::string& file) {
                        [&](const char* page) { return text::EqualsIgnoringCase(file, page); });
 }
 
-std::vector<std::string> TopicFiles(const std::string& folder) {
+std::vector<std::string> TopicFiles(const CHelpPrjTree& tree, const std::string& folder) {
     auto files = platform::Env().files->ListFiles(folder, "*.htm");
-    std::erase_if(files, IsWebHelpPage);
+    const auto backups = BackupPages(tree, files);
+    std::erase_if(files,
+                  [&](const std::string& file) { return IsWebHelpPage(file) || backups.contains(file); });
     return files;
 }
 
@@ -72,7 +75,7 @@ ResultCode CTovimar::CreateHHPAndRelatedFiles(const std::string& vstrFullPath) {
         contents.associateIndex = parameters_->AssociateHelpIndex;
         contents.fullTextSearch = parameters_->AddSearchTabToHelp;
         contents.language = LanguageOfCompiler(parameters_->LanguageCode);
-        contents.topics = TopicFiles(project->Folder);
+        contents.topics = TopicFiles(HelpProjectTree(), project->Folder);
         contents.pictures = PictureFiles(*project);
         const std::string path =
             vstrFullPath.empty() ? platform::Join(project->Folder, project->Name + ".hhp") : vstrFullPath;
@@ -88,8 +91,9 @@ void CTovimar::CreateHTextFile() {
         if (project == nullptr)
             return;
         const std::string folder = parameters_->FolderForGeneratedHelp();
-        platform::Env().files->WriteFile(folder + project->Name + ".txt",
-                                         EncodePlainText(TextPopupsText(TopicFiles(project->Folder))));
+        platform::Env().files->WriteFile(
+            folder + project->Name + ".txt",
+            EncodePlainText(TextPopupsText(TopicFiles(HelpProjectTree(), project->Folder))));
     });
 }
 
