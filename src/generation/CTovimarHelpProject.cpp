@@ -9,11 +9,13 @@
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
+#include "project/BackupPages.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
 
 #include <algorithm>
 #include <array>
+#include <unordered_set>
 
 namespace tovimar {
 namespace {
@@ -27,9 +29,11 @@ bool IsWebHelpPage(const std::string& file) {
                        [&](const char* page) { return text::EqualsIgnoringCase(file, page); });
 }
 
-std::vector<std::string> TopicFiles(const std::string& folder) {
+std::vector<std::string> TopicFiles(const CHelpPrjTree& tree, const std::string& folder) {
     auto files = platform::Env().files->ListFiles(folder, "*.htm");
-    std::erase_if(files, IsWebHelpPage);
+    const auto backups = BackupPages(tree, files);
+    const std::unordered_set<std::string> left(backups.begin(), backups.end());
+    std::erase_if(files, [&](const auto& file) { return IsWebHelpPage(file) || left.contains(file); });
     return files;
 }
 
@@ -72,7 +76,7 @@ ResultCode CTovimar::CreateHHPAndRelatedFiles(const std::string& vstrFullPath) {
         contents.associateIndex = parameters_->AssociateHelpIndex;
         contents.fullTextSearch = parameters_->AddSearchTabToHelp;
         contents.language = LanguageOfCompiler(parameters_->LanguageCode);
-        contents.topics = TopicFiles(project->Folder);
+        contents.topics = TopicFiles(HelpProjectTree(), project->Folder);
         contents.pictures = PictureFiles(*project);
         const std::string path =
             vstrFullPath.empty() ? platform::Join(project->Folder, project->Name + ".hhp") : vstrFullPath;
@@ -88,8 +92,9 @@ void CTovimar::CreateHTextFile() {
         if (project == nullptr)
             return;
         const std::string folder = parameters_->FolderForGeneratedHelp();
+        const auto topics = TopicFiles(HelpProjectTree(), project->Folder);
         platform::Env().files->WriteFile(folder + project->Name + ".txt",
-                                         EncodePlainText(TextPopupsText(TopicFiles(project->Folder))));
+                                         EncodePlainText(TextPopupsText(topics)));
     });
 }
 

@@ -8,6 +8,7 @@
 #include "platform/Environment.h"
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
+#include "project/BackupPages.h"
 #include "project/CHelpPrjTree.h"
 #include "project/CHelpPrjTreeNode.h"
 #include "project/SitemapText.h"
@@ -128,7 +129,9 @@ bool CHelpPrjTree::BuildSiteSearch(CAddInProject& robjPrj) {
     const auto engine = SearchEngine();
     const auto folder = platform::WithTrailingBackslash(robjPrj.Folder);
     const auto page = folder + "ss.html";
-    const auto exclusion = "-ihh_index_java.htm -ihh_toc_java.htm -imain.htm -i" + robjPrj.Name + "TOC.htm";
+    auto exclusion = "-ihh_index_java.htm -ihh_toc_java.htm -imain.htm -i" + robjPrj.Name + "TOC.htm";
+    for (const auto& backup : BackupPages(*this, platform::Env().files->ListFiles(folder, "*.htm")))
+        exclusion += " -i" + backup;
     const auto outcome = platform::Env().processes->RunAndWait(
         '"' + engine + "\" -d\"" + platform::WithoutTrailingBackslash(folder) +
         "\" -ehtm -s0 -w1 -p1 -m1 -u3 -n4 " + exclusion + " -x");

@@ -54,6 +54,9 @@ TEST_F(TreeTest, NewObjectsComeInAndEditedPagesStay) {
     EXPECT_TRUE(fs::exists(Folder() / "help/shop_Form_Search.htm"));
     EXPECT_THAT(ReadWhole(Folder() / "help/Forms.htm"), HasSubstr("shop_Form_Customers.htm"));
     EXPECT_THAT(Contents(), HasSubstr("shop_Form_Customers.htm"));
+    // The list page's backup stays on the disk and out of what is shipped.
+    EXPECT_THAT(ReadWhole(Folder() / "help/shop.hhp"),
+                AllOf(HasSubstr("\r\nForms.htm\r\n"), Not(HasSubstr("\r\nForms_"))));
     const auto project = ReadWhole(Folder() / "help/shop.tvp");
     EXPECT_THAT(Run({"regenerate", "help"}).ExpectExit(0).output,
                 HasSubstr("There are no new objects in the source project"));
