@@ -10,6 +10,7 @@
 #include "platform/files/NativeFile.h"
 
 #include <fcntl.h>
+#include <unordered_map>
 #include <unordered_set>
 
 namespace tovimar::helpcompiler {
@@ -66,11 +67,15 @@ public:
     }
 
 private:
-    void Complain(const std::string& text) {
-        tell_({Message::Kind::Complaint, path_.filename().string(), 0, text});
+    void Complain(const std::string& file, const std::string& text) {
+        tell_(
+            {Message::Kind::Complaint, path_.filename().string(), project_.LineOf(file), "'" + file + text});
     }
-    void Warn(const std::string& text) {
-        tell_({Message::Kind::Warning, path_.filename().string(), 0, text});
+    void ComplainOfMissing(const std::string& file) {
+        Complain(file, "' is in the project but not on the disk");
+    }
+    void Warn(int line, const std::string& text) {
+        tell_({Message::Kind::Warning, path_.filename().string(), line, text});
     }
 
     void Queue(const std::string& name) {
@@ -83,7 +88,7 @@ private:
             if (const auto found = folder_.Find(file))
                 Queue(*found);
             else
-                Complain("'" + file + "' is in the project but not on the disk");
+                ComplainOfMissing(file);
         }
     }
 
@@ -93,7 +98,7 @@ private:
             return {};
         const auto found = folder_.Find(name);
         if (!found) {
-            Complain("'" + name + "' is in the project but not on the disk");
+            ComplainOfMissing(name);
             return {};
         }
         stored = page_.Encode(*found);
@@ -114,7 +119,7 @@ private:
             return;
         const auto found = folder_.Find(project_.stopListFile);
         if (!found) {
-            Complain("'" + project_.stopListFile + "' is in the project but not on the disk");
+            ComplainOfMissing(project_.stopListFile);
             return;
         }
         std::unordered_set<std::string> words;
@@ -139,21 +144,25 @@ private:
     }
 
     void CheckContexts() {
-        std::unordered_set<std::uint32_t> ids;
+        std::unordered_map<std::uint32_t, std::string> pageOf;
         std::vector<ContextTarget> good;
-        for (ContextTarget& context : project_.help.contexts) {
-            const std::string name = page_.Decode(context.target.substr(0, context.target.find('#')));
+        for (const ContextTarget& context : project_.help.contexts) {
+            const std::string target = page_.Decode(context.target);
+            const std::string name = target.substr(0, target.find('#'));
             const auto found = folder_.Find(name);
             if (!found) {
-                Warn("'" + name + "' has a number but isn't on the disk");
+                Warn(context.line, "'" + name + "' has a number but isn't on the disk");
                 continue;
             }
-            if (!ids.insert(context.id).second)
-                Warn("the number " + std::to_string(context.id) + " stands for two pages");
+            const std::string whole = *found + target.substr(name.size());
+            const auto [first, isNew] = pageOf.try_emplace(context.id, whole);
+            if (!isNew && first->second != whole)
+                Warn(context.line, "the number " + std::to_string(context.id) + " stands for '" +
+                                       first->second + "' and for '" + whole +
+                                       "'; a program that asks for it gets the first");
             Queue(*found);
-            good.push_back(
-                {context.id, page_.Encode(*found) + context.target.substr(std::min(context.target.find('#'),
-                                                                                   context.target.size()))});
+            if (isNew)
+                good.push_back({context.id, page_.Encode(whole), context.line});
         }
         project_.help.contexts = std::move(good);
     }
@@ -219,7 +228,7 @@ private:
         for (const char byte : name + bytes)
             stamp_ = (stamp_ ^ static_cast<unsigned char>(byte)) * 16777619U;
         if (!container_.Add("/" + StoredName(name), bytes))
-            Complain("'" + name + "' has a name that can't be stored");
+            Complain(name, "' has a name that can't be stored");
     }
 
     void AddInternalFiles() {

@@ -37,6 +37,7 @@ struct Topic {
 struct ContextTarget {
     std::uint32_t id = 0;
     std::string target;
+    int line = 0; ///< of the page's alias in the project, for messages
 };
 
 struct HelpDescription {

@@ -90,6 +90,7 @@ private:
             TakeOption(line);
         } else if (section_ == "[files") {
             project_.files.push_back(Unquoted(line));
+            project_.lines.try_emplace(project_.files.back(), line_);
         } else if (section_ == "[alias") {
             TakeAlias(line);
         } else if (section_ == "[map") {
@@ -122,7 +123,7 @@ private:
         if (const auto text = texts.find(name); text != texts.end())
             *text->second = page_->Encode(option->value);
         else if (const auto file = files.find(name); file != files.end())
-            *file->second = WithSlashes(option->value);
+            project_.lines.try_emplace(*file->second = WithSlashes(option->value), line_);
         else if (const auto yes = switches.find(name); yes != switches.end())
             *yes->second = IsYes(option->value);
     }
@@ -131,8 +132,10 @@ private:
         const auto alias = SplitAssignment(line.substr(0, line.find(';')));
         if (!alias)
             return;
-        if (!aliases_.try_emplace(alias->name, alias->value).second)
-            Warn("the alias " + alias->name + " stands twice");
+        const auto [first, isNew] = aliases_.try_emplace(alias->name, Alias{alias->value, line_});
+        if (!isNew)
+            Warn("the alias " + alias->name + " stands for '" + first->second.page +
+                 "' already, since line " + std::to_string(first->second.line));
     }
 
     /// "#define IDH_ORDERS 20", or an included file of such lines.
@@ -178,7 +181,8 @@ private:
         line_ = 0;
         for (const auto& [symbol, id] : numbers_)
             if (const auto alias = aliases_.find(symbol); alias != aliases_.end())
-                help.contexts.push_back({id, page_->Encode(WithSlashes(alias->second))});
+                help.contexts.push_back(
+                    {id, page_->Encode(WithSlashes(alias->second.page)), alias->second.line});
         if (project_.compiledFile.empty())
             project_.compiledFile = name_.substr(0, name_.find_last_of('.')) + ".chm";
         help.compiledFile = page_->Encode(project_.compiledFile);
@@ -192,7 +196,11 @@ private:
     std::optional<text::CodePage> page_;
     std::string section_;
     int line_ = 0;
-    std::unordered_map<std::string, std::string> aliases_;
+    struct Alias {
+        std::string page;
+        int line = 0;
+    };
+    std::unordered_map<std::string, Alias> aliases_;
     std::vector<std::pair<std::string, std::uint32_t>> numbers_;
 };
 

@@ -6,6 +6,7 @@
 
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 namespace tovimar::helpcompiler {
@@ -19,6 +20,12 @@ struct HelpProject {
     std::string indexFile;
     std::string compiledFile; ///< UTF-8, with slashes
     std::string stopListFile;
+    std::unordered_map<std::string, int> lines; ///< on which a file is named, by its name as above
+
+    int LineOf(const std::string& file) const {
+        const auto line = lines.find(file);
+        return line == lines.end() ? 0 : line->second;
+    }
 };
 
 /// The project's text is UTF-8, or of the code page of its language. Files that it includes are read from

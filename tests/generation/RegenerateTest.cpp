@@ -186,6 +186,11 @@ TEST_F(RegenerateTest, NewObjectsComeInAndNothingElseMoves) {
                 Exists("xml\\App_Form_Customers.xml"));
     EXPECT_THAT(Page("App.hhc"), HasSubstr("App_Report_Rstock.htm"));
     EXPECT_THAT(Page("App.hhk"), HasSubstr("Customers"));
+    // The lists as they were stay beside the new ones, and out of the help.
+    const auto backups = environment->files->ListFiles(Path("help\\"), "Forms_*.htm");
+    ASSERT_EQ(backups.size(), 1U);
+    EXPECT_THAT(Page("App.hhp"), AllOf(HasSubstr("Forms.htm"), Not(HasSubstr(backups[0]))));
+    EXPECT_THAT(processes->commandLines.back(), HasSubstr(" -i" + backups[0] + " "));
     auto now = ContextIds();
     EXPECT_EQ(now.size(), ids.size() + 2);
     EXPECT_EQ(std::set<std::string>(now.begin(), now.end()).size(), now.size());

@@ -120,16 +120,17 @@ TEST(CompilerTest, TellsWhatIsWrongAndWhere) {
     folder.Write("a.htm",
                  "<a href=\"http://x/y\">\n<a href=\"../up.htm\"><a href=\"b.htm#x\"><a href=\"no%20.htm\">");
     folder.Write("p.hhc", SitemapText({{"&#322;", "a.htm"}, {"x", "lost.htm"}}));
-    EXPECT_THAT(CompileIn(folder),
-                ::testing::UnorderedElementsAre("p.hhp(9): the alias A stands twice",
-                                                "p.hhp(16): 'none.h' isn't on the disk",
-                                                "p.hhp(0): 'gone.htm' is in the project but not on the disk",
-                                                "p.hhp(0): 'none.hhk' is in the project but not on the disk",
-                                                "p.hhc(2): '&#322;' has characters beyond code page 1252",
-                                                "p.hhc(3): 'lost.htm' isn't on the disk",
-                                                "p.hhp(0): 'away.htm' has a number but isn't on the disk",
-                                                "p.hhp(0): the number 1 stands for two pages",
-                                                "a.htm(2): '../up.htm' leads out of the project",
-                                                "a.htm(2): 'no%20.htm' isn't on the disk"));
+    EXPECT_THAT(CompileIn(folder), ::testing::UnorderedElementsAre(
+                                       "p.hhp(9): the alias A stands for 'a.htm' already, since line 8",
+                                       "p.hhp(16): 'none.h' isn't on the disk",
+                                       "p.hhp(6): 'gone.htm' is in the project but not on the disk",
+                                       "p.hhp(3): 'none.hhk' is in the project but not on the disk",
+                                       "p.hhc(2): '&#322;' has characters beyond code page 1252",
+                                       "p.hhc(3): 'lost.htm' isn't on the disk",
+                                       "p.hhp(10): 'away.htm' has a number but isn't on the disk",
+                                       "p.hhp(11): the number 1 stands for 'a.htm' and for 'b.htm'; a "
+                                       "program that asks for it gets the first",
+                                       "a.htm(2): '../up.htm' leads out of the project",
+                                       "a.htm(2): 'no%20.htm' isn't on the disk"));
     EXPECT_FALSE(folder.Read("p.chm").empty()) << "named after the project";
 }

@@ -2,12 +2,14 @@
 
 #include "platform/Error.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <chrono>
 #include <csignal>
 #include <fcntl.h>
 #include <poll.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -17,6 +19,9 @@ namespace {
 
 constexpr std::size_t kMaxBytes = std::size_t{256} << 20;
 constexpr int kMaxSeconds = 60;
+/// Reading takes milliseconds per megabyte; a file whose pages lead in circles is given up soon.
+constexpr rlim_t kLeastProcessorSeconds = 5;
+constexpr rlim_t kMostProcessorSeconds = 30;
 constexpr char kDone = 'D';
 constexpr char kFailed = 'F';
 
@@ -37,8 +42,16 @@ private:
     int number_;
 };
 
-void LimitChild() {
-    const rlimit processor{30, 30};
+rlim_t ProcessorSeconds(const std::string& nativePath) {
+    struct stat file {};
+    if (::stat(nativePath.c_str(), &file) != 0)
+        return kLeastProcessorSeconds;
+    return std::min(kMostProcessorSeconds,
+                    kLeastProcessorSeconds + (static_cast<rlim_t>(file.st_size) >> 20));
+}
+
+void LimitChild(rlim_t seconds) {
+    const rlimit processor{seconds, seconds};
     ::setrlimit(RLIMIT_CPU, &processor);
     const rlimit core{0, 0};
     ::setrlimit(RLIMIT_CORE, &core);
@@ -72,8 +85,8 @@ void WriteAll(int descriptor, std::string_view bytes) {
 }
 
 /// The last byte tells how the work ended; without one the child has died before its end.
-[[noreturn]] void RunChild(int descriptor, const std::function<std::string()>& work) {
-    LimitChild();
+[[noreturn]] void RunChild(int descriptor, rlim_t seconds, const std::function<std::string()>& work) {
+    LimitChild(seconds);
     std::string answer;
     try {
         answer = work() + kDone;
@@ -122,7 +135,7 @@ std::string RunGuarded(const std::string& nativePath, const std::function<std::s
     if (child < 0)
         throw RaisedError(kFailure1, nativePath + ": no process for reading the database.", "DatabaseReader");
     if (child == 0)
-        RunChild(writing.Number(), work);
+        RunChild(writing.Number(), ProcessorSeconds(nativePath), work);
     writing.Close();
     auto answer = ReadAnswer(reading.Number());
     ::kill(child, SIGKILL);
