@@ -1,15 +1,18 @@
 #include "cli/Commands.h"
 #include "cli/Console.h"
 #include "cli/Json.h"
+#include "cli/KeptIcons.h"
 #include "cli/ProjectFile.h"
 #include "cli/ProjectReading.h"
 #include "cli/Stop.h"
 #include "cli/Surroundings.h"
+#include "cli/TouchedFiles.h"
 #include "cli/TreeNodeNames.h"
 #include "cli/TreeSteps.h"
 #include "foundation/CAddInProject.h"
 #include "foundation/CAddInProjects.h"
 #include "foundation/InputBox.h"
+#include "foundation/NameEncoding.h"
 #include "foundation/Session.h"
 #include "generation/CTovimar.h"
 #include "generation/RunProgress.h"
@@ -17,6 +20,7 @@
 #include "host/server/CTovimarServerData.h"
 #include "platform/Environment.h"
 #include "platform/MessageBoxAnswers.h"
+#include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 #include "platform/xml/XmlDocument.h"
 #include "project/CHelpPrjTree.h"
@@ -85,6 +89,7 @@ public:
         }
         if (changed_)
             Save();
+        touched_.Keep();
         if (arguments_.json)
             PrintJson(results_);
         return kDone;
@@ -94,7 +99,9 @@ private:
     CHelpPrjTree& Tree() const { return RunData().Generator().HelpProjectTree(); }
     void Load();
     void KeepIdentifiers() const;
+    void KeepPicturesFolder() const;
     void Perform(const TreeStep& step);
+    void RememberFiles(const TreeStep& step, const CHelpPrjTreeNode& node);
     void Operate(const TreeStep& step);
     void Simply(Manipulation operation) { (manipulator_.*operation)(); }
     void Delete();
@@ -111,6 +118,9 @@ private:
     ListTreeView view_;
     ProjectReading reading_;
     clsTreeViewManipulator manipulator_;
+    std::optional<KeptIcons> icons_;
+    /// Pages and definitions: a step that can't be done must leave nothing of those before it.
+    TouchedFiles touched_;
     nlohmann::ordered_json results_ = nlohmann::ordered_json::array();
     std::vector<std::string> shownEntries_;
     bool changed_ = false;
@@ -121,9 +131,20 @@ void TreeRun::Load() {
         throw Stop{{}};
     if (RunData().Generator().LoadTreviewForActiveProject() != kSuccess || Tree().Root() == nullptr)
         throw Stop{{}};
+    icons_.emplace(Tree());
     Tree().DisplayInTreeview(&view_);
     manipulator_.Init(&view_, &Tree());
     KeepIdentifiers();
+    KeepPicturesFolder();
+}
+
+/// As the project file spells it, with or without a backslash.
+void TreeRun::KeepPicturesFolder() const {
+    auto& project = *Session::CurrentProject();
+    const std::string spelled = Tree().Root()->PicsSubfolderName();
+    if (platform::WithTrailingBackslash(spelled) ==
+        platform::WithTrailingBackslash(project.PicsSubfolderName))
+        project.PicsSubfolderName = spelled;
 }
 
 /// A project that the catalogue doesn't know has them in its file alone.
@@ -143,6 +164,7 @@ void TreeRun::Perform(const TreeStep& step) {
         if (node.TreeViewNode == nullptr)
             throw Stop{"'" + step.arguments.front() + "' can't be worked on"};
         node.TreeViewNode->SetSelected(true);
+        RememberFiles(step, node);
     }
     manipulator_.RetCode = kGeneralFailure;
     Operate(step);
@@ -153,6 +175,19 @@ void TreeRun::Perform(const TreeStep& step) {
         step.operation == "xml" || (step.operation == "index" && step.arguments.size() == 1);
     changed_ = changed_ || !onlyShows;
     Tell(step);
+}
+
+void TreeRun::RememberFiles(const TreeStep& step, const CHelpPrjTreeNode& node) {
+    const std::string folder = platform::WithTrailingBackslash(Session::CurrentProject()->Folder);
+    if (step.operation == "delete")
+        touched_.Remember(node.GeneratedHTMLFileFullPath());
+    else if (step.operation == "index" && step.arguments.size() > 1)
+        touched_.Remember(node.XmlFormFullPath());
+    else if (step.operation == "new")
+        touched_.Remember(folder + NormalizeName(step.arguments[1]) + ".htm");
+    else if (step.operation == "add")
+        touched_.Remember(
+            folder + platform::FileNameOf(platform::Env().files->FromNative(FullPath(step.arguments[1]))));
 }
 
 void TreeRun::Operate(const TreeStep& step) {
@@ -262,6 +297,7 @@ void TreeRun::Tell(const TreeStep& step) {
 void TreeRun::Save() {
     // The neighbours in the view are of no use to a file without one.
     Tree().LeaveTreeview();
+    icons_->PutBack(Tree());
     if (Session::Projects()->Save(file_) != kSuccess)
         throw Stop{{}};
     Tree().WasChanged = false;

@@ -6,6 +6,7 @@
 #include <array>
 #include <memory>
 #include <string>
+#include <unordered_set>
 #include <vector>
 
 namespace tovimar {
@@ -79,6 +80,7 @@ private:
     ResultCode FindNewSourceObjects();
     void MakeNodes(const IHelpPrjSourceProject& objects);
     void MakeNodes(NewNodes& nodes, IXmlSerializer& serializer, const IHelpPrjSourceProject& objects);
+    void AssignToProject(CHelpPrjTreeNode& node, const std::string& name);
     void CompareWithTree();
     bool NewObjectFound() const;
     void FindListNodes(CHelpPrjTreeNode* start = nullptr);
@@ -89,6 +91,8 @@ private:
     void DropLists();
 
     std::array<NewNodes, kObjectKinds> newNodes_;
+    /// Folded file names of their pages.
+    std::unordered_set<std::string> newPages_;
     /// Where new objects of a kind go; not owned.
     std::array<CHelpPrjTreeNode*, kObjectKinds> listNodes_{};
     SourceObjects found_;

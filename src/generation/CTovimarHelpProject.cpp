@@ -15,6 +15,7 @@
 
 #include <algorithm>
 #include <array>
+#include <unordered_set>
 
 namespace tovimar {
 namespace {
@@ -31,8 +32,8 @@ bool IsWebHelpPage(const std::string& file) {
 std::vector<std::string> TopicFiles(const CHelpPrjTree& tree, const std::string& folder) {
     auto files = platform::Env().files->ListFiles(folder, "*.htm");
     const auto backups = BackupPages(tree, files);
-    std::erase_if(files,
-                  [&](const std::string& file) { return IsWebHelpPage(file) || backups.contains(file); });
+    const std::unordered_set<std::string> left(backups.begin(), backups.end());
+    std::erase_if(files, [&](const auto& file) { return IsWebHelpPage(file) || left.contains(file); });
     return files;
 }
 
@@ -91,9 +92,9 @@ void CTovimar::CreateHTextFile() {
         if (project == nullptr)
             return;
         const std::string folder = parameters_->FolderForGeneratedHelp();
-        platform::Env().files->WriteFile(
-            folder + project->Name + ".txt",
-            EncodePlainText(TextPopupsText(TopicFiles(HelpProjectTree(), project->Folder))));
+        const auto topics = TopicFiles(HelpProjectTree(), project->Folder);
+        platform::Env().files->WriteFile(folder + project->Name + ".txt",
+                                         EncodePlainText(TextPopupsText(topics)));
     });
 }
 

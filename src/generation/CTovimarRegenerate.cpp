@@ -179,8 +179,21 @@ void CTovimarCompiler::MakeNodes(NewNodes& nodes, IXmlSerializer& serializer,
         auto node = std::make_unique<CHelpPrjTreeNode>();
         node->Build(1, document, document->documentElement());
         node->NewUIObject = true;
+        if (Session::Parameters()->UseProjectGroupAsSource)
+            AssignToProject(*node, HostAgent().CurrentSourceProjectName());
         nodes.push_back(std::move(node));
     }
+}
+
+/// Where several applications are open an object is looked for in its own, and two that have one name have a
+/// page each: the tree doesn't know yet what the others brought.
+void CTovimarCompiler::AssignToProject(CHelpPrjTreeNode& node, const std::string& name) {
+    node.SetSourceProjectName(name);
+    const std::string file = node.GeneratedHTMLFile();
+    std::string page = file;
+    for (int number = 1; !newPages_.insert(text::FoldCase(page)).second; ++number)
+        page = name + "_" + (number == 1 ? std::string() : std::to_string(number) + "_") + file;
+    node.SetGeneratedHTMLFile(page);
 }
 
 void CTovimarCompiler::CompareWithTree() {
@@ -245,8 +258,11 @@ void CTovimarCompiler::AddToList(CHelpPrjTreeNode& list, NewNodes& nodes) {
     for (auto& made : std::exchange(nodes, NewNodes())) {
         auto& node = *made;
         // A node that was copied in the tree may have the key of this object's kind and name.
-        if (tree.MapItem(node.Key()) != nullptr)
-            node.SetKey(tree.GetNewKeyIfGivenExists(node.Key(), HostAgent().CurrentSourceProjectName()));
+        if (tree.MapItem(node.Key()) != nullptr) {
+            const std::string source = node.SourceProjectName();
+            node.SetKey(tree.GetNewKeyIfGivenExists(
+                node.Key(), source.empty() ? HostAgent().CurrentSourceProjectName() : source));
+        }
         node.Level = list.Level + 1;
         node.SetSkipped(false);
         node.RegenerateHelpFiles = true;
@@ -277,6 +293,7 @@ void CTovimarCompiler::RunRegeneration() {
 void CTovimarCompiler::DropLists() {
     for (auto& nodes : newNodes_)
         nodes.clear();
+    newPages_.clear();
     listNodes_ = {};
 }
 

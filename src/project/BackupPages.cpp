@@ -6,6 +6,7 @@
 #include "project/CHelpPrjTreeNode.h"
 
 #include <algorithm>
+#include <cctype>
 #include <unordered_set>
 
 namespace tovimar {
@@ -13,32 +14,36 @@ namespace {
 
 constexpr std::size_t kDateDigits = 8;
 
-/// "a.htm" of "a_20001017.htm" and "a_200010171.htm"; empty for other names.
-std::string NameWithoutDate(const std::string& name) {
-    const std::string extension = platform::ExtensionOf(name);
-    const std::string base = name.substr(0, name.size() - extension.size());
-    const auto line = base.rfind('_');
-    if (line == std::string::npos || base.size() - line <= kDateDigits)
+/// The name without its date and counter; empty for one that has no date.
+std::string UndatedName(const std::string& name) {
+    const std::string base = platform::BaseNameOf(name);
+    const auto dash = base.rfind('_');
+    if (dash == std::string::npos || base.size() - dash - 1 < kDateDigits)
         return {};
-    const bool digits = std::all_of(base.begin() + static_cast<std::ptrdiff_t>(line) + 1, base.end(),
-                                    [](char c) { return c >= '0' && c <= '9'; });
-    return digits ? base.substr(0, line) + extension : std::string();
+    const auto isDigit = [](char c) { return std::isdigit(static_cast<unsigned char>(c)) != 0; };
+    if (!std::all_of(base.begin() + static_cast<std::ptrdiff_t>(dash) + 1, base.end(), isDigit))
+        return {};
+    const int month = std::stoi(base.substr(dash + 5, 2));
+    const int day = std::stoi(base.substr(dash + 7, 2));
+    if (month < 1 || month > 12 || day < 1 || day > 31)
+        return {};
+    return base.substr(0, dash) + platform::ExtensionOf(name);
 }
 
 } // namespace
 
-std::set<std::string> BackupPages(const CHelpPrjTree& tree, const std::vector<std::string>& pages) {
-    const std::unordered_set<std::string> all(pages.begin(), pages.end());
-    std::set<std::string> backups;
-    for (const auto& page : pages)
-        if (all.contains(NameWithoutDate(page)))
-            backups.insert(page);
-    if (backups.empty())
-        return backups;
-    for (const auto* node : tree.MapItems())
-        std::erase_if(backups, [page = node->GeneratedHTMLFile()](const std::string& backup) {
-            return text::EqualsIgnoringCase(backup, page);
-        });
+std::vector<std::string> BackupPages(const CHelpPrjTree& tree, const std::vector<std::string>& names) {
+    std::unordered_set<std::string> known;
+    for (const auto& name : names)
+        known.insert(text::FoldCase(name));
+    std::vector<std::string> backups;
+    for (const auto& name : names) {
+        const std::string original = UndatedName(name);
+        if (original.empty() || !known.contains(text::FoldCase(original)))
+            continue;
+        if (tree.Root() == nullptr || tree.Index().FilesNamed(*tree.Root(), name) == 0)
+            backups.push_back(name);
+    }
     return backups;
 }
 

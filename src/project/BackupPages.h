@@ -1,6 +1,5 @@
 #pragma once
 
-#include <set>
 #include <string>
 #include <vector>
 
@@ -8,9 +7,9 @@ namespace tovimar {
 
 class CHelpPrjTree;
 
-/// Those of a folder's `pages` (file names) that are backups of others there: "a_20001017.htm" and
-/// "a_200010171.htm" beside "a.htm" (see BackupFileName), shown by no node of the tree. They are the writer's
-/// to keep, and no part of the help: neither compiled nor searched.
-std::set<std::string> BackupPages(const CHelpPrjTree& tree, const std::vector<std::string>& pages);
+/// Of the page names of a help folder those that `BackupFileName` gave: "a_20001017.htm" beside "a.htm". They
+/// are the writer's, on the disk, and no reader's: neither the compiled help nor the search has them. A page
+/// of such a name that is a topic of the tree is none of them.
+std::vector<std::string> BackupPages(const CHelpPrjTree& tree, const std::vector<std::string>& names);
 
 } // namespace tovimar

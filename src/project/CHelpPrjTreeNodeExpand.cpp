@@ -85,7 +85,12 @@ void CHelpPrjTreeNode::ExpandProjectGroup(CHelpPrjTree& tree, IXmlSerializer& se
         tree.ForgetSourceProject();
         serializer.Reset();
         const auto source = agent.ParseSourceProject();
+        const std::size_t before = Parent == nullptr ? 0 : Parent->children_.Count();
         ExpandSerializerNodes4CurrentProject(tree, source.get(), serializer);
+        // Where several are open an object is looked for in its own.
+        for (std::size_t i = before + 1; Parent != nullptr && i <= Parent->children_.Count(); ++i)
+            if (auto& made = *Parent->children_.At(i); made.SourceProjectName().empty())
+                made.SetSourceProjectName(name);
     }
     agent.SetCurrentSourceProject(remembered);
     tree.ForgetSourceProject();

@@ -170,6 +170,8 @@ ResultCode clsTreeViewManipulator::MoveNode(ITreeViewNode* robjTargetParentNode,
         Tell("Node cannot be moved!", "clsTreeViewManipulator.MoveNode");
         return kGeneralFailure;
     }
+    if (busy_)
+        return kFailure1;
     Request request{"MoveNode"};
     request.source = robjSourceNode->Key();
     request.target = robjTargetParentNode->Key();

@@ -44,7 +44,7 @@ public:
     /// `rstrName` takes the title that the user gave.
     void AddNew(const std::string& vstrDefaultName, std::string& rstrName);
     void AddSelected(const std::string& vstrHtmlToAddFullPath);
-    /// The source becomes the last child of the target.
+    /// The source becomes the last child of the target. 0x80040001 while another operation runs.
     ResultCode MoveNode(ITreeViewNode* robjTargetParentNode, ITreeViewNode* robjSourceNode);
     /// Contents entries and XML of the selected node; empty when that failed.
     std::string GetHHC();

@@ -3,6 +3,10 @@
 
 #include <gmock/gmock.h>
 
+#include <map>
+#include <set>
+#include <sstream>
+
 namespace tovimar::test {
 namespace {
 
@@ -42,6 +46,78 @@ TEST_F(TreeTest, OperationsAreSavedTogetherOrNotAtAll) {
     EXPECT_THAT(Contents(), Not(HasSubstr("First steps")));
 }
 
+TEST_F(TreeTest, AnEditRewritesWhatItChangesAndNoMore) {
+    const auto project = [this] { return ReadWhole(Folder() / "help/shop.tvp"); };
+    const auto icons = [](const std::string& file) {
+        std::multiset<std::string> lines;
+        std::istringstream in(file);
+        for (std::string line; std::getline(in, line);)
+            if (line.find("icon=") != std::string::npos ||
+                line.find("PicsSubfolderName") != std::string::npos)
+                lines.insert(line);
+        return lines;
+    };
+    const auto made = icons(project());
+    Run({"tree", "help", "up", "Forms/Search"}).ExpectExit(0);
+    EXPECT_EQ(icons(project()), made);
+    Run({"tree", "help", "down", "Forms/Search"}).ExpectExit(0);
+    // What was moved once says since then where it came from.
+    const auto before = project();
+    EXPECT_EQ(icons(before), made);
+    for (const char* steps : {"up", "cut"}) {
+        Run({"tree", "help", steps, "Forms/Search", "then", "undo"}).ExpectExit(0);
+        EXPECT_EQ(project(), before) << steps;
+    }
+    Run({"tree", "help", "move", "Forms/Search", "Tables", "then", "undo"}).ExpectExit(0);
+    EXPECT_EQ(icons(project()), made);
+    Run({"tree", "help", "copy", "Forms/Search", "then", "paste", "Tables"}).ExpectExit(0);
+    auto copied = made;
+    copied.insert("              icon=\"form\" \r");
+    EXPECT_EQ(icons(project()), copied);
+}
+
+TEST_F(TreeTest, StepsBeforeAFailedOneLeaveNothing) {
+    const auto files = [this] {
+        std::map<fs::path, std::string> all;
+        for (const auto& entry : fs::recursive_directory_iterator(Folder() / "help"))
+            if (entry.is_regular_file() && entry.path().extension() != ".bak")
+                all[entry.path()] = ReadWhole(entry.path());
+        return all;
+    };
+    Write("mine.htm", "<html><body>Mine</body></html>");
+    const auto before = files();
+    for (const auto& step : std::vector<std::vector<std::string>>{{"delete", "Forms/Orders", "--delete-page"},
+                                                                  {"index", "Forms/Orders", "Purchases"},
+                                                                  {"new", "Forms", "First steps"},
+                                                                  {"add", "Forms", "mine.htm"}}) {
+        std::vector<std::string> words = {"tree", "help"};
+        words.insert(words.end(), step.begin(), step.end());
+        words.insert(words.end(), {"then", "up", "Nowhere"});
+        Run(words).ExpectExit(1);
+        EXPECT_EQ(files(), before) << step[0];
+    }
+}
+
+TEST_F(TreeTest, IndexEntriesOfObjectsAndPages) {
+    const auto index = [this](const std::string& node) {
+        return Run({"tree", "help", "index", node}).ExpectExit(0).output;
+    };
+    const auto definition = [this] { return ReadWhole(Folder() / "help/xml/shop_Form_Orders.xml"); };
+    const auto project = [this] { return ReadWhole(Folder() / "help/shop.tvp"); };
+    Run({"tree", "help", "index", "Forms/Orders", "Orders"}).ExpectExit(0);
+    const auto plain = project();
+    Run({"tree", "help", "index", "Forms/Orders", "Purchases", "pur;chases", "Late \"ones\""}).ExpectExit(0);
+    EXPECT_EQ(index("Forms/Orders"), "Purchases\nLate ones\n");
+    EXPECT_THAT(definition(), HasSubstr("Purchases|Late ones"));
+    EXPECT_EQ(project(), plain) << "an object's entries stand in its definition";
+    Run({"tree", "help", "index", "Forms", "All windows"}).ExpectExit(0);
+    EXPECT_EQ(index("Forms"), "All windows\n");
+    EXPECT_THAT(project(), HasSubstr("All windows"));
+    Run({"recompile", "help"});
+    EXPECT_THAT(ReadWhole(Folder() / "help/shop.hhk"),
+                AllOf(HasSubstr("All windows"), HasSubstr("Purchases")));
+}
+
 TEST_F(TreeTest, NewObjectsComeInAndEditedPagesStay) {
     const auto edited = ReadWhole(Folder() / "help/shop_Form_Orders.htm") + "<!-- mine -->";
     Write("help/shop_Form_Orders.htm", edited);
@@ -54,6 +130,9 @@ TEST_F(TreeTest, NewObjectsComeInAndEditedPagesStay) {
     EXPECT_TRUE(fs::exists(Folder() / "help/shop_Form_Search.htm"));
     EXPECT_THAT(ReadWhole(Folder() / "help/Forms.htm"), HasSubstr("shop_Form_Customers.htm"));
     EXPECT_THAT(Contents(), HasSubstr("shop_Form_Customers.htm"));
+    // The list page's backup stays on the disk and out of what is shipped.
+    EXPECT_THAT(ReadWhole(Folder() / "help/shop.hhp"),
+                AllOf(HasSubstr("\r\nForms.htm\r\n"), Not(HasSubstr("\r\nForms_"))));
     const auto project = ReadWhole(Folder() / "help/shop.tvp");
     EXPECT_THAT(Run({"regenerate", "help"}).ExpectExit(0).output,
                 HasSubstr("There are no new objects in the source project"));

@@ -29,6 +29,7 @@ TEST_F(HelpProjectTest, ProjectFileListsPagesAndPictures) {
     Parameters().AssociateHelpIndex = true;
     Parameters().AddSearchTabToHelp = true;
     Parameters().LanguageCode = " EN ";
+    WriteFile("help\\A_20001017.htm", "as it was before a line came in");
     ASSERT_EQ(kSuccess, Generator().CreateHHPAndRelatedFiles({}));
     ExpectGolden("generation/Shop.hhp", HelpFile("Shop.hhp"));
     ExpectGolden("generation/Shop.txt", HelpFile("Shop.txt"));

@@ -7,9 +7,11 @@
 #include "generation/CTovimarCompiler.h"
 #include "generation/CTovimarParameters.h"
 #include "generation/RunProgress.h"
+#include "host/access/CN_IDEAccContext.h"
 #include "host/server/CTovimarClient.h"
 #include "host/server/CTovimarServer.h"
 #include "host/server/CTovimarServerData.h"
+#include "host/server/CXmlCommand.h"
 #include "platform/access/AccessApplication.h"
 #include "platform/text/Text.h"
 #include "project/CHelpPrjTree.h"
@@ -47,9 +49,9 @@ protected:
                (name.starts_with("R") ? ".report" : ".form");
     }
     /// A report where the name begins with R.
-    void AddObject(const std::string& name) {
+    void AddObject(const std::string& name, const std::string& application = "app") {
         const std::string kind = name.starts_with("R") ? "Report" : "Form";
-        WriteFile("app\\" + text::ToLower(kind) + "s\\" + name + "." + text::ToLower(kind),
+        WriteFile(application + "\\" + text::ToLower(kind) + "s\\" + name + "." + text::ToLower(kind),
                   "Version =20\r\nVersionRequired =20\r\nBegin " + kind +
                       "\r\n    Width =1000\r\n    Caption =\"" + name +
                       "\"\r\n    Begin\r\n        Begin Section\r\n            Height =500\r\n"
@@ -57,7 +59,7 @@ protected:
     }
     void RemoveObject(const std::string& name) const { fs::remove(Export(name)); }
 
-    void Connect(CTovimarClient& client) {
+    virtual void Connect(CTovimarClient& client) {
         RegisterSettingsLoader();
         EXPECT_EQ(client.Connect(platform::access::OpenAccessApplication(NativeFolder() + "/app")), kSuccess);
         RunData().LoadSettings();
@@ -67,6 +69,7 @@ protected:
         Connect(client);
         auto& parameters = RunData().Generator().Parameters();
         parameters.CompileHTMLHelp = false;
+        parameters.UseProjectGroupAsSource = group_;
         auto& actions = TheServer().Actions();
         ASSERT_TRUE(actions.PrepareProject({Path("help\\"), "App", {}, {}}));
         ASSERT_EQ(actions.GenerateFromOptions(), CTovimarActions::Outcome::Completed);
@@ -83,6 +86,7 @@ protected:
         CTovimarCompiler compiler;
         EXPECT_EQ(compiler.RegenerateHelpProject(), kSuccess);
         reloaded_ = CurrentOutline();
+        sources_ = Sources();
         return compiler.Report();
     }
     void ForgetBoxes() { boxes->shown.clear(); }
@@ -117,6 +121,13 @@ protected:
                 out += node->Parent->Tag + "/" + node->Name() + ";";
         return out;
     }
+    static std::string Sources() {
+        std::string out;
+        for (const auto* node : Session::HelpProjectTree()->MapItems())
+            if (node->IsObjectNode())
+                out += node->SourceProjectName() + ":" + node->Name() + "=" + node->GeneratedHTMLFile() + ";";
+        return out;
+    }
     /// Every id of the include file.
     std::multiset<std::string> ContextIds() {
         std::multiset<std::string> ids;
@@ -126,8 +137,10 @@ protected:
         return ids;
     }
 
+    bool group_ = false;
     std::set<std::string> made_;
     std::string reloaded_;
+    std::string sources_;
 };
 
 TEST_F(RegenerateTest, NewObjectsComeInAndNothingElseMoves) {
@@ -253,6 +266,76 @@ TEST_F(RegenerateTest, WhatTheWriterLeftOutStaysOut) {
     report = Regenerate();
     EXPECT_EQ(Names(report.added) + Names(report.gone), "Form Customers;");
     EXPECT_EQ(report.kept, 3U);
+}
+
+/// A host with two applications open at a time.
+class ProjectGroupTest : public RegenerateTest {
+protected:
+    ProjectGroupTest() {
+        group_ = true;
+        for (const char* kind : {"forms", "reports", "queries"})
+            environment->files->MakeFolders(Path("depot\\" + std::string(kind)));
+    }
+    void Connect(CTovimarClient& client) override {
+        RegenerateTest::Connect(client);
+        EXPECT_EQ(depot_.Connect(platform::access::OpenAccessApplication(NativeFolder() + "/depot")),
+                  kSuccess);
+        inDepot_ = false;
+        auto& callBack = TheServer().TovimarClientCallBack;
+        callBack = [this, app = callBack](const std::string& text) {
+            CXmlCommand command;
+            command.Deserialize(text);
+            if (command.Name() == "SetCurrentSourceProject")
+                inDepot_ = command.GetParamValue("ProjectName") == "depot";
+            if (command.Name() != "GetSourceProjectsList")
+                return inDepot_ ? depot_.ProcessCallBack(text) : app(text);
+            command.AddParamValue("RetValue", "app|depot");
+            return command.Serialize();
+        };
+    }
+
+    CN_IDEAccContext depot_;
+    bool inDepot_ = false;
+};
+
+TEST_F(ProjectGroupTest, EachApplicationIsJudgedByItsOwnObjects) {
+    AddObject("Orders");
+    AddObject("Orders", "depot");
+    AddObject("Stock", "depot");
+    Generate();
+    const auto before = Pages();
+    const auto ids = ContextIds();
+    // A name that the other application has, and one that both get.
+    AddObject("Stock");
+    AddObject("Both");
+    AddObject("Both", "depot");
+    AddObject("Rdepot", "depot");
+    RemoveObject("Orders");
+    const auto report = Regenerate();
+    EXPECT_TRUE(report.complete) << LastBox();
+    EXPECT_EQ(Names(report.added), "Form Both;Form Stock;Form Both;Report Rdepot;");
+    EXPECT_EQ(Names(report.gone), "Form Orders;");
+    EXPECT_EQ(report.kept, 2U);
+    EXPECT_EQ(
+        sources_,
+        "app:Orders=App_Form_Orders.htm;depot:Orders=depot_App_Form_Orders.htm;depot:Stock=App_Form_Stock."
+        "htm;"
+        "app:Both=App_Form_Both.htm;app:Stock=app_App_Form_Stock.htm;depot:Both=depot_App_Form_Both.htm;"
+        "depot:Rdepot=App_Report_Rdepot.htm;");
+    for (const auto& object : report.added)
+        EXPECT_TRUE(Exists(object.page)) << object.page;
+    for (const auto& [name, bytes] : before)
+        if (name.find("Form_") != std::string::npos) {
+            EXPECT_EQ(Page(name), bytes) << name;
+        }
+    const auto now = ContextIds();
+    EXPECT_EQ(now.size(), ids.size() + 4);
+    EXPECT_EQ(std::set<std::string>(now.begin(), now.end()).size(), now.size());
+    for (const auto& id : ids)
+        EXPECT_EQ(now.count(id), 1U) << id;
+    ForgetBoxes();
+    EXPECT_TRUE(Regenerate().added.empty());
+    EXPECT_EQ(LastBox(), "There are no new objects in the source project");
 }
 
 /// What a writer and a developer do between two regenerations, drawn from a seed.

@@ -190,6 +190,21 @@ TEST_F(TreeOperationsTest, MovesByDragAndDrop) {
     EXPECT_EQ(After("root", &clsTreeViewManipulator::Undo), "a(a2(x) a3 a1) b c");
 }
 
+TEST_F(TreeOperationsTest, ARequestThatComesInBetweenIsDropped) {
+    ResultCode inBetween = 0;
+    SetInputBox([&](const auto&, const auto&, const auto&) {
+        inBetween = manipulator.MoveNode(list.Find("c"), list.Find("b"));
+        manipulator.Cut();
+        return std::string();
+    });
+    Select("b");
+    std::string title;
+    manipulator.AddNew("Any", title);
+    EXPECT_EQ(inBetween, MakeResultCode(0x80040001U));
+    EXPECT_EQ(Outline(), "a(a1 a2(x) a3) b c");
+    EXPECT_EQ(manipulator.UndoStackLength(), 0U);
+}
+
 TEST_F(TreeOperationsTest, ControlsStayWhereTheyAre) {
     auto control = std::make_unique<CHelpPrjTreeNode>();
     control->IsControl = true;
@@ -348,6 +363,12 @@ TEST(StackTest, CursorWalksAndAPushDropsWhatLiesAbove) {
 /// What a user may do next, drawn from a seed.
 class RandomEdits : public TreeOperationsTest, public ::testing::WithParamInterface<unsigned> {
 protected:
+    std::string AnyKey(std::mt19937& random) const {
+        std::vector<std::string> keys;
+        for (const auto* node : tree.MapItems())
+            keys.push_back(node->Key());
+        return keys[random() % keys.size()];
+    }
     void Step(std::mt19937& random) {
         using Manipulator = clsTreeViewManipulator;
         static constexpr void (Manipulator::*kOperations[])() = {
@@ -356,21 +377,46 @@ protected:
             &Manipulator::Right,        &Manipulator::Paste, &Manipulator::Paste,
             &Manipulator::PasteSpecial, &Manipulator::Undo,  &Manipulator::Undo,
             &Manipulator::Left,         &Manipulator::Right, &Manipulator::ToggleSkippedFlag};
-        std::vector<std::string> keys;
-        for (const auto* node : tree.MapItems())
-            keys.push_back(node->Key());
-        const auto any = [&] { return keys[random() % keys.size()]; };
         // A growing tree is cut back.
         const auto operation = random() % (std::size(kOperations) + 1);
-        Select(any());
+        Select(AnyKey(random));
         if (operation == std::size(kOperations))
-            manipulator.MoveNode(list.Find(any()), list.Find(any()));
-        else if (keys.size() > 60)
+            manipulator.MoveNode(list.Find(AnyKey(random)), list.Find(AnyKey(random)));
+        else if (tree.MapItems().Count() > 60)
             manipulator.Cut();
         else
             (manipulator.*kOperations[operation])();
     }
 };
+
+/// Wherever the tree has got to: what an operation does is taken back to the letter, except where the undo of
+/// a move has a place of its own.
+TEST_P(RandomEdits, UndoRestoresTheTree) {
+    using Manipulator = clsTreeViewManipulator;
+    static constexpr void (Manipulator::*kInvertible[])() = {&Manipulator::Cut,   &Manipulator::Delete,
+                                                             &Manipulator::Up,    &Manipulator::Down,
+                                                             &Manipulator::Right, &Manipulator::Paste};
+    std::mt19937 random(GetParam());
+    int undone = 0;
+    for (int step = 0; step < 500; ++step) {
+        boxes->answers = {7};
+        Step(random);
+        boxes->shown.clear();
+        Select(AnyKey(random));
+        const auto before = Outline();
+        boxes->answers = {7};
+        (manipulator.*kInvertible[random() % std::size(kInvertible)])();
+        if (manipulator.RetCode != 0) {
+            ASSERT_EQ(Outline(), before) << "step " << step;
+            continue;
+        }
+        ++undone;
+        manipulator.Undo();
+        ASSERT_EQ(Outline(), before) << "step " << step;
+        ASSERT_EQ(Discord(), "") << "step " << step;
+    }
+    EXPECT_GT(undone, 100);
+}
 
 TEST_P(RandomEdits, KeepTreeMapAndViewInStep) {
     std::mt19937 random(GetParam());

@@ -1,3 +1,4 @@
+#include "project/BackupPages.h"
 #include "project/ProjectTest.h"
 
 #include "platform/text/Text.h"
@@ -81,6 +82,23 @@ TEST_F(WebHelpTest, FramePageHoldsTreeAndOptions) {
               '"' + Path("inst\\ss.exe") + "\" -d\"" + folder +
                   "\" -ehtm -s0 -w1 -p1 -m1 -u3 -n4 -ihh_index_java.htm -ihh_toc_java.htm -imain.htm "
                   "-iSalesTOC.htm -x");
+}
+
+TEST_F(WebHelpTest, BackupsOfPagesAreNotSearched) {
+    Install("");
+    LoadTree("<Project GeneratedHtmlFile='Title.htm'><A key='a' "
+             "GeneratedHtmlFile='Sales_20261123.htm'/></Project>");
+    for (const char* page :
+         {"Title.htm", "Title_20261123.htm", "title_202611232.htm", "Title_20261323.htm", "Title_2026.htm",
+          "Gone_20261123.htm", "Sales.htm", "Sales_20261123.htm", "_20261123.htm", "Title_20261123x.htm"})
+        WriteFile(page, "");
+    EXPECT_EQ(BackupPages(tree, environment->files->ListFiles(Folder(), "*.htm")),
+              (std::vector<std::string>{"Title_20261123.htm", "title_202611232.htm"}))
+        << "dates, beside the page, and no topic of their own";
+    EXPECT_EQ(tree.MakeJavaHelp(*project), 0) << LastBox();
+    EXPECT_TRUE(
+        processes->commandLines[0].ends_with(" -iSalesTOC.htm -iTitle_20261123.htm -ititle_202611232.htm -x"))
+        << processes->commandLines[0];
 }
 
 TEST_F(WebHelpTest, FramePageOfNothing) {

@@ -1,0 +1,27 @@
+#include "cli/TouchedFiles.h"
+
+#include "foundation/ErrorTrap.h"
+#include "platform/Environment.h"
+
+namespace tovimar::cli {
+
+void TouchedFiles::Remember(const std::string& path) {
+    auto& files = *platform::Env().files;
+    if (path.empty() || before_.contains(path))
+        return;
+    before_[path] = files.FileExists(path) ? std::optional(files.ReadFile(path)) : std::nullopt;
+}
+
+TouchedFiles::~TouchedFiles() {
+    auto& files = *platform::Env().files;
+    for (const auto& [path, bytes] : before_)
+        PassOver([&] {
+            const bool there = files.FileExists(path);
+            if (!bytes && there)
+                files.DeleteFile(path);
+            else if (bytes && (!there || files.ReadFile(path) != *bytes))
+                files.WriteFile(path, *bytes);
+        });
+}
+
+} // namespace tovimar::cli
