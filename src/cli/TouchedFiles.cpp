@@ -14,8 +14,9 @@ void TouchedFiles::Remember(const std::string& path) {
 
 TouchedFiles::~TouchedFiles() {
     auto& files = *platform::Env().files;
-    for (const auto& [path, bytes] : before_)
+    for (const auto& file : before_)
         PassOver([&] {
+            const auto& [path, bytes] = file;
             const bool there = files.FileExists(path);
             if (!bytes && there)
                 files.DeleteFile(path);
