@@ -312,7 +312,7 @@ int EditTree(const Arguments& arguments, Surroundings& surroundings) {
         if (!arguments.words.empty())
             return TreeRun(arguments).Run();
         auto shown = arguments;
-        shown.all = shown.numbers = true;
+        shown.leftOut = shown.numbers = true;
         return ShowContents(shown, surroundings);
     });
 }

@@ -40,6 +40,11 @@ TEST_F(TreeTest, OperationsAreSavedTogetherOrNotAtAll) {
             "  Name it by its titles (\"Forms/Orders\"), its page, or the number that \"tovimar contents "
             "--numbers\" shows.\n");
     EXPECT_EQ(ReadWhole(Folder() / "help/shop.tvp"), before);
+    Run({"tree", "help", "skip", "Forms/Search"}).ExpectExit(0);
+    EXPECT_THAT(Run({"tree", "help"}).ExpectExit(0).output,
+                AllOf(HasSubstr("    1.1  Search       shop_Form_Search.htm  (left out)\n"),
+                      HasSubstr("    3.1  Orders       shop_Form_Orders.htm\n"), Not(HasSubstr("#"))));
+    Run({"tree", "help", "unskip", "Forms/Search"}).ExpectExit(0);
     Run({"tree", "help", "wiggle", "Forms"}).ExpectExit(2);
     Run({"tree", "help", "delete", "Forms/First steps", "--delete-page"}).ExpectExit(0);
     EXPECT_FALSE(fs::exists(Folder() / "help/First_steps.htm"));
