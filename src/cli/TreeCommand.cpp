@@ -259,6 +259,8 @@ void TreeRun::Index(const TreeStep& step) {
         dialog.OKClick();
     };
     manipulator_.EditIndex();
+    if (!shows && manipulator_.RetCode != kSuccess)
+        throw Stop{"'" + step.arguments.front() + "' keeps its index entries: it needs one at least"};
     if (shows)
         manipulator_.RetCode = kSuccess;
 }

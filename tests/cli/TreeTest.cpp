@@ -118,9 +118,33 @@ TEST_F(TreeTest, IndexEntriesOfObjectsAndPages) {
     Run({"tree", "help", "index", "Forms", "All windows"}).ExpectExit(0);
     EXPECT_EQ(index("Forms"), "All windows\n");
     EXPECT_THAT(project(), HasSubstr("All windows"));
+    Run({"tree", "help", "index", "Forms", ";"})
+        .ExpectExit(1)
+        .ExpectErrors("tovimar: error: 'Forms' keeps its index entries: it needs one at least\n");
     Run({"recompile", "help"});
     EXPECT_THAT(ReadWhole(Folder() / "help/shop.hhk"),
                 AllOf(HasSubstr("All windows"), HasSubstr("Purchases")));
+}
+
+TEST_F(TreeTest, AnotherApplicationIsRefused) {
+    // A form that was left out from the start names no application.
+    auto project = ReadWhole(Folder() / "help/shop.tvp");
+    const std::string named = "  SourceProjectType = \"MS ACCESS\"  SourceProjectName = \"shop\"";
+    ASSERT_NE(project.find(named), std::string::npos);
+    Write("help/shop.tvp", project.erase(project.find(named), named.size()));
+    Run({"regenerate", "help"}).ExpectExit(0);
+    fs::rename(Folder() / "shop", Folder() / "store");
+    Run({"regenerate", "help", "store"})
+        .ExpectExit(1)
+        .ExpectErrors("Reading store\ntovimar: error: the help was made from the application 'shop', and "
+                      "this is 'store'; "
+                      "nothing was written\n");
+    EXPECT_EQ(ReadWhole(Folder() / "help/shop.tvp"), project);
+    Run({"regenerate", "help"})
+        .ExpectExit(1)
+        .ExpectErrors(
+            "tovimar: error: the application of the project isn't at '<FOLDER>/shop/shop.accdb' any "
+            "more\n  SOURCE, behind the project, names its place.\n");
 }
 
 TEST_F(TreeTest, NewObjectsComeInAndEditedPagesStay) {
