@@ -111,6 +111,9 @@ TEST_F(TreeTest, IndexEntriesOfObjectsAndPages) {
     const auto project = [this] { return ReadWhole(Folder() / "help/shop.tvp"); };
     Run({"tree", "help", "index", "Forms/Orders", "Orders"}).ExpectExit(0);
     const auto plain = project();
+    fs::remove(Folder() / "help/z1_shop.tvp.bak");
+    EXPECT_EQ(index("Forms/Orders"), "Orders\n");
+    EXPECT_FALSE(fs::exists(Folder() / "help/z1_shop.tvp.bak")) << "a look needs no backup";
     Run({"tree", "help", "index", "Forms/Orders", "Purchases", "pur;chases", "Late \"ones\""}).ExpectExit(0);
     EXPECT_EQ(index("Forms/Orders"), "Purchases\nLate ones\n");
     EXPECT_THAT(definition(), HasSubstr("Purchases|Late ones"));
