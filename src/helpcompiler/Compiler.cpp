@@ -12,13 +12,17 @@
 #include <fcntl.h>
 #include <unordered_map>
 #include <unordered_set>
+#include <zlib.h>
 
 namespace tovimar::helpcompiler {
 namespace fs = std::filesystem;
 namespace {
 
-/// Files that are read and looked through at a time.
+/// Pages that are read and looked through at a time: so many, and so many bytes of them.
 constexpr std::size_t kBatch = 64;
+constexpr std::uintmax_t kBatchBytes = std::uintmax_t{16} << 20;
+/// Of files that are only stored.
+constexpr std::size_t kPiece = std::size_t{1} << 20;
 
 std::string ReadWhole(const fs::path& path) {
     return platform::NativeFile(path.string(), O_RDONLY).ReadAll();
@@ -26,6 +30,13 @@ std::string ReadWhole(const fs::path& path) {
 
 bool IsPage(const std::string& extension) {
     return extension == "htm" || extension == "html" || extension == "xhtml";
+}
+
+/// Files that are compressed already.
+bool IsPacked(const std::string& extension) {
+    static const std::unordered_set<std::string> kPacked{"jpg", "jpeg", "png", "gif",
+                                                         "zip", "webp", "mp3", "mp4"};
+    return kPacked.contains(extension);
 }
 
 struct LoadedFile {
@@ -44,11 +55,12 @@ public:
           }),
           folder_(path.parent_path()),
           project_(ReadHelpProject(ReadWhole(path), path.filename().string(), folder_, tell_)),
-          page_(project_.help.codePage), container_(project_.help.language, 0, options.threads) {}
+          page_(project_.help.codePage),
+          container_(project_.help.language, 0, options.threads, fs::absolute(path).parent_path()) {}
 
     CompileResult Run() {
         QueueListed();
-        if (queue_.empty()) {
+        if (queued_.empty()) {
             tell_({Message::Kind::Complaint, path_.filename().string(), 0, "lists no file that exists"});
             return result_;
         }
@@ -59,8 +71,14 @@ public:
         CheckTargets(project_.help.contents, project_.contentsFile);
         CheckTargets(project_.help.index, project_.indexFile);
         CheckContexts();
-        for (std::size_t done = 0; done < queue_.size();)
+        for (std::size_t done = 0; done < pages_.size();)
             done = TakeBatch(done);
+        for (const std::string& name : others_)
+            Store(name);
+        container_.BeginPacked();
+        for (const std::string& name : pictures_)
+            Store(name);
+        container_.EndPacked();
         AddInternalFiles();
         Write();
         return result_;
@@ -79,8 +97,13 @@ private:
     }
 
     void Queue(const std::string& name) {
-        if (queued_.insert(text::FoldCase(name)).second)
-            queue_.push_back(name);
+        if (!queued_.insert(text::FoldCase(name)).second)
+            return;
+        const std::string extension = LowerExtension(name);
+        auto& queue = IsPage(extension) || extension == "css" ? pages_
+                      : IsPacked(extension)                   ? pictures_
+                                                              : others_;
+        queue.push_back(name);
     }
 
     void QueueListed() {
@@ -181,14 +204,32 @@ private:
                        (outside ? "' leads out of the project" : "' isn't on the disk")});
     }
 
+    void LeaveIfAsked() const {
+        if (options_.stop())
+            throw Interrupted();
+    }
+
     std::size_t TakeBatch(std::size_t first) {
-        std::vector<LoadedFile> files(std::min(kBatch, queue_.size() - first));
+        LeaveIfAsked();
+        std::vector<LoadedFile> files(PagesOfBatch(first));
         // Conversions of double-byte code pages keep a state that threads can't share.
         const unsigned threads = IsDoubleByte(page_.Number()) ? 1 : ThreadCount(options_.threads);
-        ForAll(files.size(), threads, [&](std::size_t i) { files[i] = Load(queue_[first + i]); });
+        ForAll(files.size(), threads, [&](std::size_t i) { files[i] = Load(pages_[first + i]); });
         for (LoadedFile& file : files)
             TakeFile(file);
         return first + files.size();
+    }
+
+    std::size_t PagesOfBatch(std::size_t first) const {
+        std::uintmax_t bytes = 0;
+        std::size_t count = 0;
+        while (count < kBatch && first + count < pages_.size() && bytes < kBatchBytes) {
+            std::error_code ignored;
+            const auto size = fs::file_size(folder_.PathOf(pages_[first + count]), ignored);
+            bytes += ignored ? 0 : size;
+            ++count;
+        }
+        return count;
     }
 
     LoadedFile Load(const std::string& name) const {
@@ -198,7 +239,7 @@ private:
         if (file.isPage) {
             file.bytes = InCodePage(file.bytes, page_);
             file.content = ReadPage(file.bytes, page_);
-        } else if (extension == "css") {
+        } else {
             file.content.references = ReadStyleSheet(file.bytes);
         }
         return file;
@@ -224,10 +265,30 @@ private:
         return name;
     }
 
+    /// Of a project's contents, for its stamp.
+    void Stamp(std::string_view bytes) {
+        stamp_ = static_cast<std::uint32_t>(
+            crc32_z(stamp_, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size()));
+    }
+
     void AddFile(const std::string& name, const std::string& bytes) {
-        for (const char byte : name + bytes)
-            stamp_ = (stamp_ ^ static_cast<unsigned char>(byte)) * 16777619U;
+        Stamp(name);
+        Stamp(bytes);
         if (!container_.Add("/" + StoredName(name), bytes))
+            Complain(name, "' has a name that can't be stored");
+    }
+
+    /// A file that nothing is read from, in pieces.
+    void Store(const std::string& name) {
+        Stamp(name);
+        const platform::NativeFile file(folder_.PathOf(name).string(), O_RDONLY);
+        const bool stored = container_.AddInPieces("/" + StoredName(name), [&] {
+            LeaveIfAsked();
+            std::string piece = file.ReadHere(kPiece);
+            Stamp(piece);
+            return piece;
+        });
+        if (!stored)
             Complain(name, "' has a name that can't be stored");
     }
 
@@ -242,11 +303,14 @@ private:
     }
 
     void Write() {
-        const std::string bytes = container_.Finish();
         const fs::path target = path_.parent_path() / project_.compiledFile;
         platform::NativeFile file = platform::NativeFile::TemporaryBeside(target.string());
         try {
-            file.WriteAll(bytes);
+            container_.Finish([&](std::string_view bytes) {
+                LeaveIfAsked();
+                file.WriteAll(bytes);
+                result_.bytes += bytes.size();
+            });
             file.Close();
             fs::rename(file.Path(), target);
         } catch (...) {
@@ -254,7 +318,6 @@ private:
             fs::remove(file.Path(), ignored);
             throw;
         }
-        result_.bytes = bytes.size();
         result_.file = target;
     }
 
@@ -267,10 +330,10 @@ private:
     text::CodePage page_;
     Container container_;
     SearchIndex search_;
-    std::vector<std::string> queue_;
+    std::vector<std::string> pages_, others_, pictures_; ///< style sheets with the pages
     std::unordered_set<std::string> queued_;
     std::unordered_set<std::string> missing_; ///< told already
-    std::uint32_t stamp_ = 2166136261U;
+    std::uint32_t stamp_ = 0;
 };
 
 } // namespace

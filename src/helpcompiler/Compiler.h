@@ -3,7 +3,9 @@
 #include "helpcompiler/Message.h"
 
 #include <cstdint>
+#include <exception>
 #include <filesystem>
+#include <functional>
 #include <optional>
 
 /// Compiles a help project (`.hhp`) into one compressed file that help viewers open: its pages with what they
@@ -15,6 +17,12 @@ struct CompileOptions {
     /// What the file says of its time; without one a number made of the contents, so that the same project
     /// gives the same bytes and a changed one another stamp.
     std::optional<std::uint32_t> time;
+    /// Asked between the pieces of the work; yes ends it with Interrupted, and nothing was written.
+    std::function<bool()> stop = [] { return false; };
+};
+
+struct Interrupted : std::exception {
+    const char* what() const noexcept override { return "interrupted"; }
 };
 
 struct CompileResult {

@@ -13,7 +13,8 @@ constexpr std::size_t kBatch = 64 * kLzxInterval;
 
 } // namespace
 
-Compressor::Compressor(unsigned threads) : threads_(ThreadCount(threads)) {}
+Compressor::Compressor(unsigned threads, const std::filesystem::path& scratch)
+    : threads_(ThreadCount(threads)), content_{Spool(scratch), {}, 0} {}
 
 std::uint64_t Compressor::Add(std::string_view bytes) {
     const std::uint64_t offset = content_.length;
@@ -43,14 +44,18 @@ void Compressor::CompressPending(bool all) {
     const std::size_t count = (pending_.size() + kLzxInterval - 1) / kLzxInterval;
     std::vector<LzxInterval> intervals(count);
     ForAll(count, threads_, [&](std::size_t i) {
-        intervals[i] = CompressInterval(std::string_view(pending_).substr(i * kLzxInterval, kLzxInterval));
+        const auto bytes = std::string_view(pending_).substr(i * kLzxInterval, kLzxInterval);
+        const std::uint64_t begin = begin_ + i * kLzxInterval;
+        const bool packed = begin >= packedFrom_ && begin + bytes.size() <= packedTo_;
+        intervals[i] = CompressInterval(bytes, packed ? Expect::Packed : Expect::Anything);
     });
     for (const LzxInterval& interval : intervals) {
         for (std::size_t frame = 0; frame < interval.frames; ++frame)
-            content_.frames.push_back(content_.bytes.size() +
+            content_.frames.push_back(content_.bytes.Size() +
                                       (frame == 0 ? 0 : interval.frameEnds[frame - 1]));
-        content_.bytes += interval.bytes;
+        content_.bytes.Add(interval.bytes);
     }
+    begin_ += pending_.size();
     pending_.clear();
 }
 

@@ -48,7 +48,7 @@ std::string ResetTable(const CompressedContent& content) {
     for (const std::uint32_t number : {2U, static_cast<std::uint32_t>(content.frames.size()), 8U, 0x28U})
         PutU32(out, number);
     PutU64(out, content.length);
-    PutU64(out, content.bytes.size());
+    PutU64(out, content.bytes.Size());
     PutU64(out, kLzxFrame);
     for (const std::uint64_t frame : content.frames)
         PutU64(out, frame);
@@ -57,13 +57,29 @@ std::string ResetTable(const CompressedContent& content) {
 
 } // namespace
 
+bool Container::TakeName(const std::string& name) {
+    return name.size() <= kLongestName && names_.insert(text::FoldCase(name)).second;
+}
+
 bool Container::Add(const std::string& name, std::string_view bytes, bool compressed) {
-    if (name.size() > kLongestName || !names_.insert(text::FoldCase(name)).second)
+    if (!TakeName(name))
         return false;
     if (compressed)
         entries_.push_back({name, 1, compressor_.Add(bytes), bytes.size()});
     else
         plain_.push_back({name, std::string(bytes)});
+    return true;
+}
+
+bool Container::AddInPieces(const std::string& name, const Read& read) {
+    if (!TakeName(name))
+        return false;
+    DirectoryEntry entry{name, 1, compressor_.Add({}), 0};
+    for (std::string piece = read(); !piece.empty(); piece = read()) {
+        compressor_.Add(piece);
+        entry.length += piece.size();
+    }
+    entries_.push_back(std::move(entry));
     return true;
 }
 
@@ -84,7 +100,7 @@ void Container::AddDescription(const CompressedContent& content) {
     AddPlain(storage + "Transform/" + kTransform + "/InstanceData/ResetTable", ResetTable(content));
     for (const Plain& file : plain_)
         AddPlain(file.name, file.bytes);
-    AddPlain(storage + "Content", content.bytes);
+    entries_.push_back({storage + "Content", 0, section_.size(), content.bytes.Size()});
 }
 
 void Container::AddFolders() {
@@ -99,14 +115,14 @@ void Container::AddFolders() {
         entries_.push_back({folder});
 }
 
-std::string Container::Header(std::size_t directory, std::size_t content) const {
+std::string Container::Header(std::size_t directory, std::uint64_t content) const {
     std::string out = "ITSF";
     for (const std::uint32_t number : {3U, static_cast<std::uint32_t>(kHeaderSize), 1U, time_, language_})
         PutU32(out, number);
     out += FromHex("10fd017caa7bd0119e0c00a0c922e6ec");
     out += FromHex("11fd017caa7bd0119e0c00a0c922e6ec");
-    const std::size_t contentOffset = kHeaderSize + kFirstSectionSize + directory;
-    for (const std::size_t number :
+    const std::uint64_t contentOffset = kHeaderSize + kFirstSectionSize + directory;
+    for (const std::uint64_t number :
          {kHeaderSize, kFirstSectionSize, kHeaderSize + kFirstSectionSize, directory, contentOffset})
         PutU64(out, number);
     PutU32(out, 0x1FE);
@@ -116,13 +132,21 @@ std::string Container::Header(std::size_t directory, std::size_t content) const 
     return out;
 }
 
-std::string Container::Finish() {
-    AddDescription(compressor_.Finish());
+void Container::Finish(const Write& write) {
+    const CompressedContent content = compressor_.Finish();
+    AddDescription(content);
     AddFolders();
     const std::string directory = DirectoryBytes(std::move(entries_));
-    std::string out = Header(directory.size(), section_.size());
-    out.reserve(out.size() + directory.size() + section_.size());
-    return out.append(directory).append(section_);
+    write(Header(directory.size(), section_.size() + content.bytes.Size()));
+    write(directory);
+    write(section_);
+    content.bytes.CopyTo(write);
+}
+
+std::string Container::Finish() {
+    std::string out;
+    Finish([&](std::string_view bytes) { out += bytes; });
+    return out;
 }
 
 } // namespace tovimar::helpcompiler

@@ -202,6 +202,7 @@ LzxInterval Stored(std::string_view input) {
     for (int i = 0; i < 3; ++i)
         PutU32(result.bytes, 1); // the last offsets
     const std::size_t head = result.bytes.size();
+    result.bytes.reserve(head + input.size());
     result.bytes += input;
     while (result.frames * kLzxFrame < input.size()) {
         ++result.frames;
@@ -210,23 +211,30 @@ LzxInterval Stored(std::string_view input) {
     return result;
 }
 
-/// True for bytes as evenly spread as those of pictures, which are compressed already: not worth a try.
-bool IsDense(std::string_view input) {
-    constexpr double kDenseBits = 7.93; // of the eight of a byte
+/// Whether the bytes are spread so evenly that each holds so many bits of its eight. Looks at one byte in
+/// `step`.
+bool IsDense(std::string_view input, double bitsOfByte, std::size_t step) {
     std::array<std::uint32_t, 256> counts{};
-    for (const char byte : input)
-        ++counts[static_cast<unsigned char>(byte)];
+    std::size_t seen = 0;
+    for (std::size_t i = 0; i < input.size(); i += step, ++seen)
+        ++counts[static_cast<unsigned char>(input[i])];
     double bits = 0;
     for (const std::uint32_t count : counts)
         if (count > 0)
-            bits += count * std::log2(static_cast<double>(input.size()) / count);
-    return bits > kDenseBits * static_cast<double>(input.size());
+            bits += count * std::log2(static_cast<double>(seen) / count);
+    return bits > bitsOfByte * static_cast<double>(seen);
+}
+
+/// Not worth a try: as evenly spread as pictures that are compressed already. Of what is said to be packed a
+/// sample will do.
+bool IsPacked(std::string_view input, Expect expect) {
+    return expect == Expect::Packed ? IsDense(input, 7.0, 7) : IsDense(input, 7.93, 1);
 }
 
 } // namespace
 
-LzxInterval CompressInterval(std::string_view input) {
-    if (IsDense(input))
+LzxInterval CompressInterval(std::string_view input, Expect expect) {
+    if (IsPacked(input, expect))
         return Stored(input);
     LzxInterval packed = Encoder(input).Encode();
     return packed.bytes.size() < input.size() ? packed : Stored(input);

@@ -20,7 +20,10 @@ struct LzxInterval {
     std::size_t frames = 0;
 };
 
+/// What a caller knows of the bytes: those of pictures are packed already, and only glanced at.
+enum class Expect { Anything, Packed };
+
 /// One interval, of one or two whole frames. Anything else is a fault of the caller.
-LzxInterval CompressInterval(std::string_view input);
+LzxInterval CompressInterval(std::string_view input, Expect expect = Expect::Anything);
 
 } // namespace tovimar::helpcompiler

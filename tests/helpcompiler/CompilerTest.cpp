@@ -4,6 +4,8 @@
 
 #include <gmock/gmock.h>
 
+#include <filesystem>
+#include <random>
 #include <set>
 
 using namespace tovimar::helpcompiler;
@@ -107,6 +109,56 @@ TEST(CompilerTest, GivesTheSameBytesEachTimeAndOnAnyNumberOfThreads) {
     folder.Write("b.htm", "changed");
     CompileIn(folder);
     EXPECT_NE(folder.Read("p.chm").substr(0x10, 4), first.substr(0x10, 4));
+}
+
+TEST(CompilerTest, LargeFilesGoThroughInPieces) {
+    const Folder folder;
+    WriteProject(folder);
+    std::minstd_rand random(7);
+    std::string picture(std::size_t{12} << 20, '\0');
+    for (char& byte : picture)
+        byte = static_cast<char>(random() >> 8U);
+    std::string words;
+    while (words.size() < std::size_t{3} << 20)
+        words += "word" + std::to_string(random() % 5000) + ' ';
+    folder.Write("large.jpg", picture);
+    folder.Write("plain.png", std::string(300000, 'x')); // no picture at all, and worth its squeezing
+    folder.Write("words.txt", words);
+    folder.Write("none.gif", "");
+    folder.Write("p.hhp", "[FILES]\na.htm\nlarge.jpg\nwords.txt\nplain.png\nnone.gif\n");
+    EXPECT_THAT(CompileIn(folder), ::testing::IsEmpty());
+    ASSERT_TRUE(folder.Run("7z x -ox p.chm")) << folder.Read("printed");
+    EXPECT_TRUE(folder.Read("x/large.jpg") == picture);
+    EXPECT_TRUE(folder.Read("x/words.txt") == words);
+    EXPECT_EQ(folder.Read("x/none.gif"), "");
+    EXPECT_LT(folder.Read("p.chm").size(), picture.size() + words.size() / 2);
+}
+
+TEST(CompilerTest, InterruptedItLeavesTheEarlierFile) {
+    const Folder folder;
+    WriteProject(folder);
+    folder.Write("p.chm", "earlier");
+    const auto names = [&] {
+        std::set<std::string> all;
+        for (const auto& entry : std::filesystem::directory_iterator(folder.Path()))
+            all.insert(entry.path().filename().string());
+        return all;
+    };
+    const auto before = names();
+    int last = 0;
+    for (;; ++last) {
+        int asked = 0;
+        const auto stop = [&] { return asked++ == last; };
+        try {
+            Compile(folder.Path() / "p.hhp", {0, std::nullopt, stop}, [](const Message&) {});
+            break;
+        } catch (const Interrupted&) {
+            ASSERT_EQ(folder.Read("p.chm"), "earlier");
+            ASSERT_EQ(names(), before);
+        }
+    }
+    EXPECT_GT(last, 4);
+    EXPECT_GT(folder.Read("p.chm").size(), 5000U);
 }
 
 TEST(CompilerTest, TellsWhatIsWrongAndWhere) {

@@ -53,6 +53,15 @@ std::optional<NativeFile> NativeFile::UnnamedBeside(const std::string& target) {
     return NativeFile(descriptor, target, target);
 }
 
+NativeFile NativeFile::ScratchIn(const std::string& folder) {
+    std::string pattern = folder + "/.tovimar-XXXXXX";
+    const int descriptor = mkostemp(pattern.data(), O_CLOEXEC);
+    if (descriptor < 0)
+        RaiseFileFailure(errno, folder);
+    unlink(pattern.c_str());
+    return NativeFile(descriptor, pattern, folder);
+}
+
 bool NativeFile::GiveName() {
     const std::string self = "/proc/self/fd/" + std::to_string(descriptor_);
     return linkat(AT_FDCWD, self.c_str(), AT_FDCWD, path_.c_str(), AT_SYMLINK_FOLLOW) == 0;

@@ -18,6 +18,8 @@ public:
     /// A fresh file without a name where `target` is to stand, gone when it never gets it. None where the
     /// file system has no such files, or the folder can't be written to.
     static std::optional<NativeFile> UnnamedBeside(const std::string& target);
+    /// A fresh file without a name, to be written, read and forgotten. Failures name the folder.
+    static NativeFile ScratchIn(const std::string& folder);
     /// Of an unnamed file, the name that it was opened for. False where it can't get it, for one because it
     /// is taken by now.
     bool GiveName();
