@@ -29,6 +29,7 @@
 #include "project/clsTreeViewManipulator.h"
 #include "project/frmHHCEntryIndexKeywords.h"
 
+#include <algorithm>
 #include <nlohmann/json.hpp>
 
 namespace tovimar::cli {
@@ -66,6 +67,14 @@ public:
 private:
     FixedAnswer* fixed_;
 };
+
+bool ShowsIndex(const TreeStep& step) {
+    return step.operation == "index" && step.arguments.size() == 1;
+}
+
+bool OnlyShows(const TreeStep& step) {
+    return step.operation == "xml" || ShowsIndex(step);
+}
 
 /// One command run: the steps in order, saved together behind the last one.
 class TreeRun {
@@ -127,7 +136,7 @@ private:
 };
 
 void TreeRun::Load() {
-    if (!TheServer().BackUpHelpProjectFile(file_))
+    if (!std::all_of(steps_.begin(), steps_.end(), OnlyShows) && !TheServer().BackUpHelpProjectFile(file_))
         throw Stop{{}};
     if (RunData().Generator().LoadTreviewForActiveProject() != kSuccess || Tree().Root() == nullptr)
         throw Stop{{}};
@@ -171,9 +180,7 @@ void TreeRun::Perform(const TreeStep& step) {
     if (manipulator_.RetCode != kSuccess)
         throw Stop{"\"" + step.operation + (step.arguments.empty() ? "" : " " + step.arguments.front()) +
                    "\" can't be done; nothing was saved"};
-    const bool onlyShows =
-        step.operation == "xml" || (step.operation == "index" && step.arguments.size() == 1);
-    changed_ = changed_ || !onlyShows;
+    changed_ = changed_ || !OnlyShows(step);
     Tell(step);
 }
 
@@ -245,7 +252,7 @@ void TreeRun::SetSkipped(CHelpPrjTreeNode& node, bool skipped) {
 }
 
 void TreeRun::Index(const TreeStep& step) {
-    const bool shows = step.arguments.size() == 1;
+    const bool shows = ShowsIndex(step);
     frmHHCEntryIndexKeywords::ShowDialog = [&](frmHHCEntryIndexKeywords& dialog) {
         if (shows) {
             ShowIndex(dialog.IndexesCollection());
@@ -259,6 +266,8 @@ void TreeRun::Index(const TreeStep& step) {
         dialog.OKClick();
     };
     manipulator_.EditIndex();
+    if (!shows && manipulator_.RetCode != kSuccess)
+        throw Stop{"'" + step.arguments.front() + "' keeps its index entries: it needs one at least"};
     if (shows)
         manipulator_.RetCode = kSuccess;
 }
@@ -279,7 +288,7 @@ void TreeRun::Tell(const TreeStep& step) {
     if (step.operation == "xml" || node == nullptr)
         return;
     const std::string number = HasNumber(*node) ? NodeNumber(*node) : std::string();
-    const bool shows = step.operation == "index" && step.arguments.size() == 1;
+    const bool shows = ShowsIndex(step);
     if (arguments_.json) {
         nlohmann::ordered_json result{{"operation", step.operation},
                                       {"number", number},
@@ -312,7 +321,7 @@ int EditTree(const Arguments& arguments, Surroundings& surroundings) {
         if (!arguments.words.empty())
             return TreeRun(arguments).Run();
         auto shown = arguments;
-        shown.all = shown.numbers = true;
+        shown.leftOut = shown.numbers = true;
         return ShowContents(shown, surroundings);
     });
 }
