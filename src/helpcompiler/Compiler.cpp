@@ -55,8 +55,8 @@ public:
           }),
           folder_(path.parent_path()),
           project_(ReadHelpProject(ReadWhole(path), path.filename().string(), folder_, tell_)),
-          page_(project_.help.codePage),
-          container_(project_.help.language, 0, options.threads, fs::absolute(path).parent_path()) {}
+          page_(project_.help.codePage), target_(fs::absolute(path).parent_path() / project_.compiledFile),
+          container_(project_.help.language, 0, options.threads, target_.parent_path()) {}
 
     CompileResult Run() {
         QueueListed();
@@ -246,10 +246,10 @@ private:
     }
 
     void TakeFile(const LoadedFile& file) {
-        AddFile(file.name, file.bytes);
+        const bool stored = AddFile(file.name, file.bytes);
         for (const PageReference& reference : file.content.references)
             QueueTarget(file.name, reference, file.name);
-        if (!file.isPage)
+        if (!file.isPage || !stored)
             return;
         if (project_.help.fullTextSearch)
             search_.Add(static_cast<std::uint32_t>(project_.help.pages.size()), file.content.words);
@@ -271,25 +271,28 @@ private:
             crc32_z(stamp_, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size()));
     }
 
-    void AddFile(const std::string& name, const std::string& bytes) {
+    bool AddFile(const std::string& name, const std::string& bytes) {
         Stamp(name);
         Stamp(bytes);
-        if (!container_.Add("/" + StoredName(name), bytes))
+        return IsStored(name, container_.Add("/" + StoredName(name), bytes));
+    }
+
+    bool IsStored(const std::string& name, bool stored) {
+        if (!stored)
             Complain(name, "' has a name that can't be stored");
+        return stored;
     }
 
     /// A file that nothing is read from, in pieces.
     void Store(const std::string& name) {
         Stamp(name);
         const platform::NativeFile file(folder_.PathOf(name).string(), O_RDONLY);
-        const bool stored = container_.AddInPieces("/" + StoredName(name), [&] {
+        IsStored(name, container_.AddInPieces("/" + StoredName(name), [&] {
             LeaveIfAsked();
             std::string piece = file.ReadHere(kPiece);
             Stamp(piece);
             return piece;
-        });
-        if (!stored)
-            Complain(name, "' has a name that can't be stored");
+        }));
     }
 
     void AddInternalFiles() {
@@ -303,8 +306,7 @@ private:
     }
 
     void Write() {
-        const fs::path target = path_.parent_path() / project_.compiledFile;
-        platform::NativeFile file = platform::NativeFile::TemporaryBeside(target.string());
+        platform::NativeFile file = platform::NativeFile::TemporaryBeside(target_.string());
         try {
             container_.Finish([&](std::string_view bytes) {
                 LeaveIfAsked();
@@ -312,13 +314,13 @@ private:
                 result_.bytes += bytes.size();
             });
             file.Close();
-            fs::rename(file.Path(), target);
+            fs::rename(file.Path(), target_);
         } catch (...) {
             std::error_code ignored;
             fs::remove(file.Path(), ignored);
             throw;
         }
-        result_.file = target;
+        result_.file = target_;
     }
 
     fs::path path_;
@@ -328,6 +330,7 @@ private:
     ProjectFolder folder_;
     HelpProject project_;
     text::CodePage page_;
+    fs::path target_; ///< absolute
     Container container_;
     SearchIndex search_;
     std::vector<std::string> pages_, others_, pictures_; ///< style sheets with the pages

@@ -1,5 +1,6 @@
 #include "helpcompiler/Compiler.h"
 #include "Tools.h"
+#include "platform/Error.h"
 #include "support/SearchReader.h"
 
 #include <gmock/gmock.h>
@@ -132,6 +133,55 @@ TEST(CompilerTest, LargeFilesGoThroughInPieces) {
     EXPECT_TRUE(folder.Read("x/words.txt") == words);
     EXPECT_EQ(folder.Read("x/none.gif"), "");
     EXPECT_LT(folder.Read("p.chm").size(), picture.size() + words.size() / 2);
+}
+
+/// Empty files, the longest names that Windows knows, and one that no entry of the directory can hold.
+TEST(CompilerTest, NamesAndFilesOfAnyLength) {
+    const Folder folder;
+    const std::string deep = std::string(120, 'd') + "/" + std::string(100, 'e') + "/";
+    const std::string longest = deep + std::string(34, 'n') + ".htm";
+    ASSERT_EQ(longest.size(), 260U);
+    std::string beyond;
+    while (beyond.size() < 1100)
+        beyond += std::string(200, 'x') + "/";
+    beyond += "a.htm";
+    folder.Write(longest, "<title>Long</title>name");
+    folder.Write(beyond, "<title>Longer</title>");
+    std::string project = "[OPTIONS]\nFull-text search=Yes\n[FILES]\n" + longest + "\n" + beyond + "\n";
+    for (const char* empty : {"none.htm", "none.css", "none.png", "none.txt"}) {
+        folder.Write(empty, "");
+        project += std::string(empty) + "\n";
+    }
+    folder.Write("p.hhp", project);
+    EXPECT_THAT(CompileIn(folder),
+                ::testing::ElementsAre("p.hhp(5): '" + beyond + "' has a name that can't be stored"));
+    ASSERT_TRUE(folder.Run("7z x -ox p.chm && extract_chmLib p.chm y")) << folder.Read("printed");
+    for (const char* reader : {"x/", "y/"}) {
+        EXPECT_EQ(folder.Read(reader + longest), "<title>Long</title>name");
+        EXPECT_TRUE(std::filesystem::is_empty(folder.Path() / reader / "none.png"));
+    }
+    EXPECT_EQ(folder.Read("x/#TOPICS").size(), 2 * 16U) << "no topic without its page";
+    EXPECT_EQ(SearchReader(folder.Read("x/$FIftiMain")).Words(), (std::vector<std::string>{"long", "name"}));
+}
+
+/// What is compressed waits in the folder of the result, which may be another than the project's: that one
+/// may be read-only. When the folder isn't there, this shows in the first megabytes.
+TEST(CompilerTest, WritesBesideItsTargetAlone) {
+    const Folder folder;
+    WriteProject(folder);
+    std::minstd_rand random(3);
+    std::string large(std::size_t{13} << 20, '\0');
+    for (char& byte : large)
+        byte = static_cast<char>(random() >> 8U);
+    folder.Write("project/large.jpg", large);
+    folder.Write("project/p.hhp", "[OPTIONS]\nCompiled file=../none/p.chm\n[FILES]\nlarge.jpg\n");
+    try {
+        Compile(folder.Path() / "project/p.hhp", {}, [](const Message&) {});
+        FAIL() << "written into a folder that isn't there";
+    } catch (const tovimar::RaisedError& error) {
+        EXPECT_TRUE(std::string(error.what()).ends_with("/none'")) << error.what();
+    }
+    EXPECT_EQ(FilesBelow(folder.Path() / "project"), (std::set<std::string>{"large.jpg", "p.hhp"}));
 }
 
 TEST(CompilerTest, InterruptedItLeavesTheEarlierFile) {

@@ -66,6 +66,10 @@ TEST(LzxTest, StoresWhatDoesNotShrink) {
     EXPECT_EQ(interval.bytes.size(), dense.size() + 16);
     EXPECT_EQ(interval.frameEnds[0], kLzxFrame + 16);
     EXPECT_LT(CompressInterval(std::string(kLzxInterval, 'x')).bytes.size(), 700U);
+    EXPECT_EQ(CompressInterval(dense, Expect::Packed).bytes, interval.bytes);
+    // Pictures of forms aren't as dense as their name promises.
+    const std::string picture = Random(kLzxInterval / 2, 180, 5);
+    EXPECT_LT(CompressInterval(picture + picture, Expect::Packed).bytes.size(), kLzxInterval * 95 / 100);
 }
 
 TEST(LzxTest, CopiesEndWithTheirFrame) {
