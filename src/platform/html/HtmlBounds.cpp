@@ -184,8 +184,8 @@ void Scan::Open(const std::string& name) {
 
 void Scan::OpenItem(Family family) {
     // Outside of their lists these two nest.
-    const bool nests = (family == Family::Ruby && open_["ruby"] == 0) ||
-                       (family == Family::Group && open_["select"] == 0);
+    const bool nests =
+        (family == Family::Ruby && open_["ruby"] == 0) || (family == Family::Group && open_["select"] == 0);
     if (std::exchange(last_, family) == family && !nests)
         return;
     ++items_;
