@@ -1,3 +1,4 @@
+#include "cli/AnsweredStep.h"
 #include "cli/Commands.h"
 #include "cli/Console.h"
 #include "cli/Json.h"
@@ -36,37 +37,6 @@ namespace tovimar::cli {
 namespace {
 
 using Manipulation = void (clsTreeViewManipulator::*)();
-
-/// Answers every question of one step, for whoever has answered it on the command line.
-class FixedAnswer : public platform::MessageBoxes {
-public:
-    explicit FixedAnswer(int answer) : answer_(answer), before_(std::move(platform::Env().messageBoxes)) {}
-    int Show(const std::string& text, std::uint32_t flags, const std::string& title) override {
-        constexpr std::uint32_t kButtons = 7;
-        return (flags & kButtons) == 0 ? before_->Show(text, flags, title) : answer_;
-    }
-    std::unique_ptr<platform::MessageBoxes> Before() { return std::move(before_); }
-
-private:
-    int answer_;
-    std::unique_ptr<platform::MessageBoxes> before_;
-};
-
-/// The boxes of the surroundings, replaced as long as it lives.
-class AnsweredStep {
-public:
-    explicit AnsweredStep(int answer) {
-        auto boxes = std::make_unique<FixedAnswer>(answer);
-        fixed_ = boxes.get();
-        platform::Env().messageBoxes = std::move(boxes);
-    }
-    ~AnsweredStep() { platform::Env().messageBoxes = fixed_->Before(); }
-    AnsweredStep(const AnsweredStep&) = delete;
-    AnsweredStep& operator=(const AnsweredStep&) = delete;
-
-private:
-    FixedAnswer* fixed_;
-};
 
 bool ShowsIndex(const TreeStep& step) {
     return step.operation == "index" && step.arguments.size() == 1;
