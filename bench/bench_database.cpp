@@ -5,10 +5,9 @@
 // Reading is done in a process of its own each time, so that its memory can be told: the most that it has,
 // less what a process has that reads nothing.
 
+#include "ChildRun.h"
 #include "platform/access/database/DatabaseDesigns.h"
 
-#include <sys/resource.h>
-#include <sys/wait.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -48,19 +47,6 @@ void ReadAll(const std::string& file) {
             DesignOfTree(designs.Tree(kind, name), kind, name, file);
 }
 
-/// Kilobytes that the process of a step had at most.
-long Peak(const std::function<void()>& step) {
-    const pid_t child = fork();
-    if (child == 0) {
-        step();
-        _exit(0);
-    }
-    rusage usage{};
-    int status = 0;
-    wait4(child, &status, 0, &usage);
-    return usage.ru_maxrss;
-}
-
 void Measure(const std::string& file) {
     const fs::path work = fs::temp_directory_path() / ("tovimar-bench-" + std::to_string(getpid()));
     fs::create_directories(work);
@@ -76,7 +62,14 @@ void Measure(const std::string& file) {
             std::puts("THE RUN FAILED");
     });
     const double size = static_cast<double>(fs::file_size(file));
-    const long peak = Peak([&] { ReadAll(file); }) - Peak([] {});
+    const auto peakOf = [](const std::function<void()>& step) {
+        const auto child = tovimar::bench::RunInChild([&] {
+            step();
+            return 0;
+        });
+        return static_cast<long>(1024 * child.peakMegabytes);
+    };
+    const long peak = peakOf([&] { ReadAll(file); }) - peakOf([] {});
     std::printf(
         "%s: %.2f MB, designs read in %.1f ms, documented in %.0f ms: %.1f %%; memory %.1f times the file\n",
         fs::path(file).filename().c_str(), size / 1e6, reading * 1e3, run * 1e3, 100 * reading / run,

@@ -4,6 +4,7 @@
 //     bench_generation [OBJECTS...]     default 1000 10000, and sports-admin where it is at hand
 //     bench_generation topic            one topic of a form with 100 controls
 
+#include "ChildRun.h"
 #include "SyntheticApplication.h"
 
 #include "foundation/Session.h"
@@ -25,8 +26,6 @@
 
 #include <turbojpeg.h>
 
-#include <sys/resource.h>
-#include <sys/wait.h>
 #include <unistd.h>
 
 #include <chrono>
@@ -54,32 +53,12 @@ private:
     std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
 };
 
-struct Run {
-    double seconds = 0;
-    double processorSeconds = 0;
-    double peakMegabytes = 0;
-};
-
-Run Generate(const fs::path& source, const fs::path& output) {
-    const Stopwatch watch;
-    const pid_t child = fork();
-    if (child == 0) {
-        std::freopen("/dev/null", "w", stdout);
-        std::freopen("/dev/null", "w", stderr);
-        execl(TOVIMAR_PROGRAM, "tovimar", "generate", source.c_str(), "--output", output.c_str(),
-              "--no-compile", nullptr);
-        _exit(127);
-    }
-    int status = 0;
-    rusage usage{};
-    wait4(child, &status, 0, &usage);
-    if (!WIFEXITED(status) || WEXITSTATUS(status) != 0)
-        std::fprintf(stderr, "the run ended with %d\n", WIFEXITED(status) ? WEXITSTATUS(status) : -1);
-    const auto seconds = [](const timeval& time) {
-        return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
-    };
-    return {watch.Seconds(), seconds(usage.ru_utime) + seconds(usage.ru_stime),
-            static_cast<double>(usage.ru_maxrss) / 1024};
+bench::ChildRun Generate(const fs::path& source, const fs::path& output) {
+    const auto run = bench::RunProgram(
+        {TOVIMAR_PROGRAM, "generate", source.string(), "--output", output.string(), "--no-compile"});
+    if (run.exitCode != 0)
+        std::fprintf(stderr, "the run ended with %d\n", run.exitCode);
+    return run;
 }
 
 std::string ReadAll(const fs::path& path) {
@@ -169,7 +148,7 @@ void Measure(const char* name, const fs::path& source, const fs::path& work) {
     const fs::path output = work / "out";
     fs::remove_all(output);
     fs::remove_all(work / "copy");
-    const Run run = Generate(source, output);
+    const bench::ChildRun run = Generate(source, output);
     const Floor floor = MeasureFloor(output, work / "copy");
     const double painting = MeasurePainting(source);
     const double floorSeconds = floor.writing + floor.encoding;
@@ -234,13 +213,13 @@ void MeasureTopic(const fs::path& work) {
     constexpr int kForms = 200, kRuns = 5;
     const fs::path source = work / "many", project = work / "out0" / "many.tvp";
     bench::WriteLargeForms(source, kForms);
-    Run run{1e9, 0, 0};
+    bench::ChildRun run{1e9};
     Stages stages{1e9, 0, 0};
     double encoding = 1e9;
     for (int i = 0; i < kRuns; ++i) {
         // Folders of their own: a file system may be slow where files have just been deleted.
         const fs::path output = work / ("out" + std::to_string(i));
-        if (const Run one = Generate(source, output); one.seconds < run.seconds)
+        if (const bench::ChildRun one = Generate(source, output); one.seconds < run.seconds)
             run = one;
         encoding = std::min(encoding, MeasureFloor(output, work / ("copy" + std::to_string(i))).encoding);
         if (const Stages one = MeasureStages(source, project); one.Sum() < stages.Sum())

@@ -1,33 +1,29 @@
-// Measures the help compiler against chmcmd, where that is installed: pages of words alone, and the same with
-// pictures that are compressed already.
+// Measures the help compiler against chmcmd, where that is installed: pages of words alone, the same with
+// pictures that are compressed already, and the help of a real application.
 //
-//     bench_help [PAGES]             default 340
+//     bench_help [PAGES | PROJECT.hhp]...     default 340 3400, and sports-admin where it is at hand
 //
-// Figures are seconds of the wall clock, the least of three runs; the other compiler runs once.
+// Seconds are those of the wall clock, and of all processors in parentheses: the least of three runs of ours,
+// one of the other. Memory is the most that the process had at a time; it grows with the names and the index
+// of words, not with the pictures.
 
-#include "helpcompiler/Compiler.h"
+#include "ChildRun.h"
 
 #include <algorithm>
-#include <chrono>
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <functional>
 #include <random>
 #include <string>
 #include <unistd.h>
+#include <vector>
 
 namespace fs = std::filesystem;
-using namespace tovimar::helpcompiler;
+using tovimar::bench::ChildRun;
+using tovimar::bench::RunProgram;
 
 namespace {
-
-double Seconds(const std::function<void()>& step) {
-    const auto start = std::chrono::steady_clock::now();
-    step();
-    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
-}
 
 void Write(const fs::path& path, const std::string& bytes) {
     std::ofstream(path, std::ios::binary) << bytes;
@@ -61,30 +57,92 @@ void WriteProject(const fs::path& folder, int pages, bool pictures) {
     Write(folder / "p.hhp", project);
 }
 
-void Measure(const fs::path& folder, int pages, bool pictures) {
-    WriteProject(folder, pages, pictures);
-    double ours = 1e9;
-    std::uintmax_t size = 0;
-    for (int i = 0; i < 3; ++i)
-        ours = std::min(ours,
-                        Seconds([&] { size = Compile(folder / "p.hhp", {}, [](const Message&) {}).bytes; }));
-    std::printf("%5d pages%s: %7.2f s, %ju bytes\n", pages, pictures ? " with pictures" : "", ours, size);
-    const std::string other = "cd '" + folder.string() + "' && chmcmd p.hhp >/dev/null 2>&1";
-    int code = 0;
-    const double theirs = Seconds([&] { code = std::system(other.c_str()); });
-    if (code == 0)
-        std::printf("             chmcmd: %7.2f s, %ju bytes; %.0f times as long\n", theirs,
-                    fs::file_size(folder / "p.chm"), theirs / ours);
+/// Size of the one compiled help in a folder, in megabytes.
+double CompiledMegabytes(const fs::path& folder) {
+    for (const auto& entry : fs::directory_iterator(folder))
+        if (entry.path().extension() == ".chm")
+            return static_cast<double>(entry.file_size()) / 1e6;
+    return 0;
+}
+
+struct Compiled {
+    ChildRun run;
+    double megabytes = 0;
+};
+
+Compiled CompileWith(const char* compiler, const fs::path& project, int times) {
+    setenv("TOVIMAR_HELP_COMPILER", compiler, 1);
+    Compiled best;
+    best.run.seconds = best.run.processorSeconds = 1e9;
+    for (int i = 0; i < times; ++i) {
+        const ChildRun run = RunProgram({TOVIMAR_HELP_COMPILER, project.string()});
+        best.run.seconds = std::min(best.run.seconds, run.seconds);
+        best.run.processorSeconds = std::min(best.run.processorSeconds, run.processorSeconds);
+        best.run.peakMegabytes = std::max(best.run.peakMegabytes, run.peakMegabytes);
+        best.run.exitCode = run.exitCode;
+    }
+    best.megabytes = CompiledMegabytes(project.parent_path());
+    return best;
+}
+
+void Print(const std::string& name, const Compiled& compiled) {
+    std::printf("%-26s %7.2f s (%7.2f), %4.0f MB of memory, %8.3f MB compiled%s", name.c_str(),
+                compiled.run.seconds, compiled.run.processorSeconds, compiled.run.peakMegabytes,
+                compiled.megabytes, compiled.run.exitCode == 0 ? "" : " with complaints");
+}
+
+void Measure(const std::string& name, const fs::path& project) {
+    const Compiled ours = CompileWith("", project, 3);
+    Print(name, ours);
+    std::printf("\n");
+    if (RunProgram({"sh", "-c", "command -v chmcmd"}).exitCode != 0)
+        return;
+    const Compiled theirs = CompileWith("chmcmd", project, 1);
+    Print("    chmcmd", theirs);
+    std::printf(
+        ": %.0f times as long (%.0f), ours is %.1f%% of its size\n", theirs.run.seconds / ours.run.seconds,
+        theirs.run.processorSeconds / ours.run.processorSeconds, 100 * ours.megabytes / theirs.megabytes);
+    std::fflush(stdout);
+}
+
+void MeasurePages(const fs::path& work, int pages) {
+    for (const bool pictures : {false, true}) {
+        const fs::path folder = work / "pages";
+        fs::create_directories(folder);
+        WriteProject(folder, pages, pictures);
+        Measure(std::to_string(pages) + (pictures ? " pages with pictures" : " pages"), folder / "p.hhp");
+        fs::remove_all(folder);
+    }
+}
+
+void MeasureSample(const fs::path& work) {
+    const fs::path application = fs::path(TOVIMAR_SOURCE_DIR) / "../shared/corpus/sports-admin";
+    if (!fs::exists(application))
+        return;
+    setenv("XDG_DATA_HOME", (work / "data").c_str(), 1);
+    setenv("XDG_CONFIG_HOME", (work / "config").c_str(), 1);
+    const fs::path help = work / "help";
+    RunProgram({TOVIMAR_PROGRAM, "generate", fs::canonical(application).string(), "--output", help.string(),
+                "--copy-to", work.string(), "--no-compile"});
+    Measure("sports-admin", help / "sports-admin.hhp");
 }
 
 } // namespace
 
 int main(int count, char** arguments) {
-    const int pages = count > 1 ? std::max(1, std::atoi(arguments[1])) : 340;
     std::string pattern = (fs::temp_directory_path() / "bench_helpXXXXXX").string();
-    const fs::path folder = mkdtemp(pattern.data());
-    Measure(folder, pages, false);
-    Measure(folder, pages, true);
-    fs::remove_all(folder);
+    const fs::path work = mkdtemp(pattern.data());
+    std::vector<std::string> asked(arguments + 1, arguments + count);
+    if (asked.empty()) {
+        MeasureSample(work);
+        asked = {"340", "3400"};
+    }
+    for (const std::string& one : asked) {
+        if (one.ends_with(".hhp"))
+            Measure(fs::path(one).stem().string(), fs::absolute(one));
+        else
+            MeasurePages(work, std::max(1, std::atoi(one.c_str())));
+    }
+    fs::remove_all(work);
     return 0;
 }

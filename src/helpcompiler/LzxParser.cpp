@@ -6,6 +6,7 @@
 #include <bit>
 #include <cstddef>
 #include <cstring>
+#include <optional>
 #include <utility>
 
 namespace tovimar::helpcompiler {
@@ -35,14 +36,19 @@ public:
     }
 
     std::vector<LzxItem> Parse() {
+        std::optional<Match> ahead; // of a match that gave way to a better one behind a literal
         for (std::size_t at = 0; at < input_.size();) {
-            const Match match = Find(at);
+            const Match match = ahead ? *ahead : Find(at);
+            ahead.reset();
             Enter(at, 1);
-            if (match.length == 0 || (match.length < kLongEnough && IsBetterBehind(match, at + 1))) {
+            if (match.length > 0 && match.length < kLongEnough && at + 1 < input_.size())
+                ahead = Find(at + 1);
+            if (match.length == 0 || (ahead && Worth(*ahead) > Worth(match))) {
                 items_.push_back({1, static_cast<std::uint8_t>(input_[at]), 0, 0});
                 ++at;
                 continue;
             }
+            ahead.reset();
             Enter(at + 1, match.length - 1);
             Take(match);
             at += match.length;
@@ -91,6 +97,8 @@ private:
     }
 
     /// A match of a recent offset costs about as much as a byte less of another.
+    static std::size_t Worth(const Match& match) { return match.length + (match.recent >= 0 ? 1 : 0); }
+
     Match Find(std::size_t at) const {
         const std::size_t most = std::min(kLongest, kLzxFrame - at % kLzxFrame);
         Match best = FindRecent(at, most);
@@ -124,15 +132,6 @@ private:
                 best = {length, recent_[i], static_cast<int>(i)};
         }
         return best;
-    }
-
-    /// Whether a literal first is worth it.
-    bool IsBetterBehind(const Match& match, std::size_t at) const {
-        if (at >= input_.size())
-            return false;
-        const Match next = Find(at);
-        const std::size_t worth = match.length + (match.recent >= 0 ? 1 : 0);
-        return next.length + (next.recent >= 0 ? 1 : 0) > worth;
     }
 
     void Take(const Match& match) {
