@@ -18,20 +18,8 @@ using platform::access::DatabaseDesigns;
 using platform::access::InspectedObject;
 using platform::access::InspectedProperty;
 using platform::access::Inspection;
+using platform::access::KindWord;
 using platform::access::ObjectKind;
-
-const char* KindWord(ObjectKind kind) {
-    switch (kind) {
-    case ObjectKind::Form:
-        return "form";
-    case ObjectKind::Report:
-        return "report";
-    case ObjectKind::Macro:
-        return "macro";
-    default:
-        return "module";
-    }
-}
 
 nlohmann::ordered_json AsJson(const InspectedObject& object) {
     nlohmann::ordered_json json{{"type", object.type}, {"name", object.name}};

@@ -42,24 +42,6 @@ template <typename Visit> void ForEachNamed(const DesignObject& root, const Visi
     }
 }
 
-const char* KindWord(ObjectKind kind) {
-    switch (kind) {
-    case ObjectKind::Form:
-        return "form";
-    case ObjectKind::Report:
-        return "report";
-    case ObjectKind::Macro:
-        return "macro";
-    case ObjectKind::Query:
-        return "query";
-    case ObjectKind::Table:
-        return "table";
-    case ObjectKind::Module:
-        return "module";
-    }
-    return "object";
-}
-
 } // namespace
 
 ApplicationModel::ApplicationModel(const std::string& nativePath) {

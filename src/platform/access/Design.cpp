@@ -54,6 +54,24 @@ int SectionNumber(const DesignObject& object) {
 
 } // namespace
 
+const char* KindWord(ObjectKind kind) {
+    switch (kind) {
+    case ObjectKind::Form:
+        return "form";
+    case ObjectKind::Report:
+        return "report";
+    case ObjectKind::Macro:
+        return "macro";
+    case ObjectKind::Query:
+        return "query";
+    case ObjectKind::Table:
+        return "table";
+    case ObjectKind::Module:
+        return "module";
+    }
+    return "object";
+}
+
 bool DesignObject::Is(std::string_view typeName) const {
     return text::EqualsIgnoringCase(type, typeName);
 }

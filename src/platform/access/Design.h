@@ -19,6 +19,9 @@ namespace tovimar::platform::access {
 /// Numbers are the host's: tables 0, queries 1, forms 2, reports 3, macros 4, modules 5.
 enum class ObjectKind { Table = 0, Query = 1, Form = 2, Report = 3, Macro = 4, Module = 5 };
 
+/// "form", "query", ... as messages say it.
+const char* KindWord(ObjectKind kind);
+
 /// A property as it stands in the source: text in quotes decoded, numbers as they are written, flags as
 /// "NotDefault", blobs ("Begin ... End" of hexadecimal) as bytes.
 struct PropertyValue {

@@ -15,10 +15,6 @@ namespace {
 constexpr auto kContainers = std::to_array<std::pair<ObjectKind, std::string_view>>(
     {{ObjectKind::Form, "Forms"}, {ObjectKind::Report, "Reports"}, {ObjectKind::Macro, "Scripts"}});
 
-const char* KindWord(ObjectKind kind) {
-    return kind == ObjectKind::Form ? "form" : kind == ObjectKind::Report ? "report" : "macro";
-}
-
 } // namespace
 
 const Storage& DatabaseDesigns::Kept() {
