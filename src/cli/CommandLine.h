@@ -52,6 +52,7 @@ struct Arguments {
     std::string settingName;
     std::string settingValue;
     bool all = false;
+    bool leftOut = false; ///< entries of the contents that the help doesn't have
     bool numbers = false; ///< of the entries of the contents
     /// Of the command `tree`: the operations, with "then" between them, and what becomes of a deleted page.
     std::vector<std::string> words;

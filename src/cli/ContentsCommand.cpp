@@ -62,18 +62,24 @@ void AddControls(const CHelpPrjTreeNode& node, Entry& entry) {
         add(*control, "control");
 }
 
-Entry Described(const CHelpPrjTreeNode& node, bool all, const std::string& number = "0") {
+/// What is shown besides the entries of the help.
+struct Shown {
+    bool leftOut = false;
+    bool controls = false;
+};
+
+Entry Described(const CHelpPrjTreeNode& node, const Shown& shown, const std::string& number = "0") {
     Entry entry{number,     node.ContentsText(), Kind(node), node.Name(), node.GeneratedHTMLFile(),
                 node.Key(), node.Skipped(),      {}};
-    if (all && node.IsObjectNode())
+    if (shown.controls && node.IsObjectNode())
         AddControls(node, entry);
     std::size_t place = 0;
     for (const auto& child : node.Children()) {
         if (!HasNumber(*child))
             continue;
         ++place;
-        if (all || !child->Skipped())
-            entry.children.push_back(Described(*child, all, ChildNumber(number, place)));
+        if (shown.leftOut || !child->Skipped())
+            entry.children.push_back(Described(*child, shown, ChildNumber(number, place)));
     }
     return entry;
 }
@@ -118,7 +124,7 @@ int Show(const Arguments& arguments) {
     CHelpPrjTree tree;
     if (tree.Load(file) != kSuccess || tree.Root() == nullptr)
         throw Stop{{}, kFailed};
-    Entry root = Described(*tree.Root(), arguments.all);
+    Entry root = Described(*tree.Root(), {arguments.all || arguments.leftOut, arguments.all});
     std::string text;
     if (arguments.json)
         PrintJson(AsJson(root));

@@ -13,6 +13,8 @@
 #include "platform/files/Paths.h"
 #include "platform/text/Text.h"
 
+#include <algorithm>
+#include <cstddef>
 #include <cstdio>
 
 namespace tovimar::cli {
@@ -40,6 +42,12 @@ std::string CopyComplaint(const Arguments& arguments) {
     return {};
 }
 
+static std::ptrdiff_t WarningsIn(const std::string& output) {
+    const auto lines = text::Split(output, "\n");
+    return std::count_if(lines.begin(), lines.end(),
+                         [](const std::string& line) { return line.starts_with("hhc: warning: "); });
+}
+
 bool CompilerSucceeded(bool verbose) {
     const auto& generator = *Session::Generator();
     const bool compiled = platform::Env().files->FileExists(Session::Parameters()->CompiledHelpFullPath());
@@ -48,8 +56,13 @@ bool CompilerSucceeded(bool verbose) {
                    generator.CompilerOutput);
         return false;
     }
-    if (verbose && !generator.CompilerOutput.empty())
+    if (generator.CompilerOutput.empty())
+        return true;
+    if (verbose)
         PrintHint(generator.CompilerOutput);
+    else if (const auto warnings = WarningsIn(generator.CompilerOutput); warnings > 0)
+        PrintHint("The help compiler has " + std::to_string(warnings) +
+                  (warnings == 1 ? " warning; --verbose shows it." : " warnings; --verbose shows them."));
     return true;
 }
 

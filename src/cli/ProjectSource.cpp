@@ -15,31 +15,37 @@ namespace tovimar::cli {
 
 namespace {
 
-[[noreturn]] void RefuseMissing(const std::string& source) {
-    throw Stop{"the application of the project isn't at '" + source +
-               "' any more\n--source names its place."};
+[[noreturn]] void RefuseMissing(const std::string& source, const std::string& option) {
+    throw Stop{"the application of the project isn't at '" + source + "' any more\n" + option +
+               " names its place."};
+}
+
+/// How a command takes the place of the application.
+const char* SourceOption(const Arguments& arguments) {
+    return arguments.command == Arguments::Command::Regenerate ? "SOURCE, behind the project,"
+                                                               : kSourceOption;
 }
 
 } // namespace
 
 /// The catalogue knows what each project was made from.
-std::string RememberedSource(const std::string& projectFile) {
+std::string RememberedSource(const std::string& projectFile, const std::string& option) {
     CAddInProjects catalogue;
     catalogue.Init(CataloguePath());
     const auto* project = catalogue.GetProjectDefinitionByTvpFullPath(projectFile);
     if (project == nullptr || project->SourceProjectFullPath.empty())
-        throw Stop{"it isn't known which application '" + projectFile +
-                   "' was made from\n--source names its exports or its database."};
+        throw Stop{"it isn't known which application '" + projectFile + "' was made from\n" + option +
+                   " names its exports or its database."};
     const std::string& source = project->SourceProjectFullPath;
     auto& files = *platform::Env().files;
     if (!files.FileExists(source) && !files.FolderExists(platform::FolderOf(source)))
-        RefuseMissing(source);
+        RefuseMissing(source, option);
     return source;
 }
 
 /// A folder of exports counts as a database of its name, which needn't be there; with one at hand the exports
 /// beside it still belong to it.
-HostObject OpenRemembered(const std::string& source) {
+HostObject OpenRemembered(const std::string& source, const std::string& option) {
     auto& files = *platform::Env().files;
     try {
         auto application =
@@ -52,7 +58,7 @@ HostObject OpenRemembered(const std::string& source) {
             throw;
     }
     if (!files.FileExists(source))
-        RefuseMissing(source);
+        RefuseMissing(source, option);
     return platform::access::OpenAccessApplication(files.ToNative(source));
 }
 
@@ -65,10 +71,10 @@ HostObject ProjectSource::OpenApplication() {
         surroundings_.Progress().Phase("Reading " + source_);
         return platform::access::OpenAccessApplication(source_);
     }
-    const std::string remembered = RememberedSource(projectFile_);
+    const std::string remembered = RememberedSource(projectFile_, SourceOption(arguments_));
     source_ = NativeSource(remembered);
     surroundings_.Progress().Phase("Reading " + source_);
-    return OpenRemembered(remembered);
+    return OpenRemembered(remembered, SourceOption(arguments_));
 }
 
 void ProjectSource::Open() {

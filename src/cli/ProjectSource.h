@@ -7,14 +7,17 @@
 
 namespace tovimar::cli {
 
+/// What a refusal calls the argument that names the place of an application.
+constexpr const char* kSourceOption = "--source";
+
 struct Arguments;
 class Surroundings;
 
 /// Windows path of the application that the catalogue remembers for a project. Raises `Stop` when it doesn't
 /// know it, or nothing is there any more.
-std::string RememberedSource(const std::string& projectFile);
+std::string RememberedSource(const std::string& projectFile, const std::string& option = kSourceOption);
 /// Raises `Stop` when it isn't there any more.
-HostObject OpenRemembered(const std::string& source);
+HostObject OpenRemembered(const std::string& source, const std::string& option = kSourceOption);
 
 /// A help project and the application that it was made from, for the commands that work on a help that
 /// exists. Raises `Stop` where one of the two can't be had.

@@ -54,7 +54,7 @@ void AddTree(CLI::App& app, Arguments& parsed) {
                    "tovimar tree shop-help move Forms/Orders Basics then new Basics \"First steps\"");
     AddProject(*tree, parsed)->required();
     tree->add_option("OPERATION", parsed.words,
-                     "what to do, see below; without one the contents are shown with their numbers")
+                     "what to do, see below; without one all entries are shown with their numbers")
         ->type_name("");
     auto* keep = tree->add_flag_callback(
         "--keep-page", [&parsed] { parsed.pages = Pages::Keep; }, "the pages of deleted entries stay");

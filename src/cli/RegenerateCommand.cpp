@@ -91,7 +91,7 @@ bool Regeneration::LookForNewObjects() {
     return found;
 }
 
-/// Every object of another application would be a new one.
+/// Every object of another application would be a new one. Objects that were never documented name none.
 void Regeneration::CheckApplication(const CHelpPrjTree& tree) const {
     std::vector<CHelpPrjTreeNode*> nodes;
     tree.CollectObjectNodes(nodes);
@@ -99,9 +99,10 @@ void Regeneration::CheckApplication(const CHelpPrjTree& tree) const {
     std::string other;
     for (const auto* node : nodes) {
         const std::string ofNode = node->SourceProjectName();
-        if (ofNode.empty() || text::EqualsIgnoringCase(ofNode, name))
+        if (text::EqualsIgnoringCase(ofNode, name))
             return;
-        other = ofNode;
+        if (!ofNode.empty())
+            other = ofNode;
     }
     if (!other.empty())
         throw Stop{"the help was made from the application '" + other + "', and this is '" + name +

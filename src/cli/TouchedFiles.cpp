@@ -4,6 +4,18 @@
 #include "platform/Environment.h"
 
 namespace tovimar::cli {
+namespace {
+
+void PutBack(const std::string& path, const std::optional<std::string>& bytes) {
+    auto& files = *platform::Env().files;
+    const bool there = files.FileExists(path);
+    if (!bytes && there)
+        files.DeleteFile(path);
+    else if (bytes && (!there || files.ReadFile(path) != *bytes))
+        files.WriteFile(path, *bytes);
+}
+
+} // namespace
 
 void TouchedFiles::Remember(const std::string& path) {
     auto& files = *platform::Env().files;
@@ -13,15 +25,8 @@ void TouchedFiles::Remember(const std::string& path) {
 }
 
 TouchedFiles::~TouchedFiles() {
-    auto& files = *platform::Env().files;
-    for (const auto& [path, bytes] : before_)
-        PassOver([&] {
-            const bool there = files.FileExists(path);
-            if (!bytes && there)
-                files.DeleteFile(path);
-            else if (bytes && (!there || files.ReadFile(path) != *bytes))
-                files.WriteFile(path, *bytes);
-        });
+    for (const auto& file : before_)
+        PassOver([&] { PutBack(file.first, file.second); });
 }
 
 } // namespace tovimar::cli

@@ -1,3 +1,4 @@
+#include "cli/AnsweredStep.h"
 #include "cli/Commands.h"
 #include "cli/Console.h"
 #include "cli/Json.h"
@@ -29,6 +30,7 @@
 #include "project/clsTreeViewManipulator.h"
 #include "project/frmHHCEntryIndexKeywords.h"
 
+#include <algorithm>
 #include <nlohmann/json.hpp>
 
 namespace tovimar::cli {
@@ -36,36 +38,13 @@ namespace {
 
 using Manipulation = void (clsTreeViewManipulator::*)();
 
-/// Answers every question of one step, for whoever has answered it on the command line.
-class FixedAnswer : public platform::MessageBoxes {
-public:
-    explicit FixedAnswer(int answer) : answer_(answer), before_(std::move(platform::Env().messageBoxes)) {}
-    int Show(const std::string& text, std::uint32_t flags, const std::string& title) override {
-        constexpr std::uint32_t kButtons = 7;
-        return (flags & kButtons) == 0 ? before_->Show(text, flags, title) : answer_;
-    }
-    std::unique_ptr<platform::MessageBoxes> Before() { return std::move(before_); }
+bool ShowsIndex(const TreeStep& step) {
+    return step.operation == "index" && step.arguments.size() == 1;
+}
 
-private:
-    int answer_;
-    std::unique_ptr<platform::MessageBoxes> before_;
-};
-
-/// The boxes of the surroundings, replaced as long as it lives.
-class AnsweredStep {
-public:
-    explicit AnsweredStep(int answer) {
-        auto boxes = std::make_unique<FixedAnswer>(answer);
-        fixed_ = boxes.get();
-        platform::Env().messageBoxes = std::move(boxes);
-    }
-    ~AnsweredStep() { platform::Env().messageBoxes = fixed_->Before(); }
-    AnsweredStep(const AnsweredStep&) = delete;
-    AnsweredStep& operator=(const AnsweredStep&) = delete;
-
-private:
-    FixedAnswer* fixed_;
-};
+bool OnlyShows(const TreeStep& step) {
+    return step.operation == "xml" || ShowsIndex(step);
+}
 
 /// One command run: the steps in order, saved together behind the last one.
 class TreeRun {
@@ -127,7 +106,7 @@ private:
 };
 
 void TreeRun::Load() {
-    if (!TheServer().BackUpHelpProjectFile(file_))
+    if (!std::all_of(steps_.begin(), steps_.end(), OnlyShows) && !TheServer().BackUpHelpProjectFile(file_))
         throw Stop{{}};
     if (RunData().Generator().LoadTreviewForActiveProject() != kSuccess || Tree().Root() == nullptr)
         throw Stop{{}};
@@ -171,9 +150,7 @@ void TreeRun::Perform(const TreeStep& step) {
     if (manipulator_.RetCode != kSuccess)
         throw Stop{"\"" + step.operation + (step.arguments.empty() ? "" : " " + step.arguments.front()) +
                    "\" can't be done; nothing was saved"};
-    const bool onlyShows =
-        step.operation == "xml" || (step.operation == "index" && step.arguments.size() == 1);
-    changed_ = changed_ || !onlyShows;
+    changed_ = changed_ || !OnlyShows(step);
     Tell(step);
 }
 
@@ -245,7 +222,7 @@ void TreeRun::SetSkipped(CHelpPrjTreeNode& node, bool skipped) {
 }
 
 void TreeRun::Index(const TreeStep& step) {
-    const bool shows = step.arguments.size() == 1;
+    const bool shows = ShowsIndex(step);
     frmHHCEntryIndexKeywords::ShowDialog = [&](frmHHCEntryIndexKeywords& dialog) {
         if (shows) {
             ShowIndex(dialog.IndexesCollection());
@@ -259,6 +236,8 @@ void TreeRun::Index(const TreeStep& step) {
         dialog.OKClick();
     };
     manipulator_.EditIndex();
+    if (!shows && manipulator_.RetCode != kSuccess)
+        throw Stop{"'" + step.arguments.front() + "' keeps its index entries: it needs one at least"};
     if (shows)
         manipulator_.RetCode = kSuccess;
 }
@@ -279,7 +258,7 @@ void TreeRun::Tell(const TreeStep& step) {
     if (step.operation == "xml" || node == nullptr)
         return;
     const std::string number = HasNumber(*node) ? NodeNumber(*node) : std::string();
-    const bool shows = step.operation == "index" && step.arguments.size() == 1;
+    const bool shows = ShowsIndex(step);
     if (arguments_.json) {
         nlohmann::ordered_json result{{"operation", step.operation},
                                       {"number", number},
@@ -312,7 +291,7 @@ int EditTree(const Arguments& arguments, Surroundings& surroundings) {
         if (!arguments.words.empty())
             return TreeRun(arguments).Run();
         auto shown = arguments;
-        shown.all = shown.numbers = true;
+        shown.leftOut = shown.numbers = true;
         return ShowContents(shown, surroundings);
     });
 }

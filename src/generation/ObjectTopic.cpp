@@ -1,5 +1,6 @@
 #include "generation/ObjectTopic.h"
 
+#include "foundation/BackupFileName.h"
 #include "foundation/CAddInProject.h"
 #include "foundation/Session.h"
 #include "generation/CTovimar.h"
@@ -89,11 +90,15 @@ void ObjectTopic::CountObject() const {
     }
 }
 
-/// A failure further down must leave no old topic behind.
+/// A failure further down must leave no old topic behind. In a help that lives on it is a writer's: that of
+/// an object whose entry was taken out of the contents.
 void ObjectTopic::DeleteOldTopic() const {
     const std::string old = node_.GeneratedHTMLFileFullPath();
-    if (node_.IsObjectNode() && !old.empty() && platform::Env().files->FileExists(old))
-        platform::Env().files->DeleteFile(old);
+    if (!node_.IsObjectNode() || old.empty() || !platform::Env().files->FileExists(old))
+        return;
+    if (node_.RegenerateHelpFiles && !BackUpFile(old))
+        throw RaisedError(kFailure1, "No backup of '" + old + "' can be written", "ObjectTopic");
+    platform::Env().files->DeleteFile(old);
 }
 
 void ObjectTopic::FixPaths() {

@@ -14,12 +14,12 @@ namespace {
 /// Takes blanks, the quotes around a value and the slash of an element's end off.
 std::string Unquoted(std::string_view value) {
     std::string name = text::Trim(value);
-    if (!name.empty() && name.front() == '"')
+    if (!name.empty() && IsQuote(name.front()))
         name.erase(0, 1);
     if (!name.empty() && name.back() == '/')
         name.pop_back();
     name = text::Trim(name);
-    if (!name.empty() && name.back() == '"')
+    if (!name.empty() && IsQuote(name.back()))
         name.pop_back();
     return name;
 }
@@ -82,8 +82,9 @@ void CFormHTMLControlDef::ReadMarkedAnchor(const std::vector<std::string>& parts
         if (found == std::string::npos)
             return;
         const std::string name = text::Mid(part.substr(found + FormName.size()), 2);
-        const std::size_t quoted = name.find("\">");
-        BookmarkName = name.substr(0, quoted != std::string::npos ? quoted : name.find('>'));
+        BookmarkName = name.substr(0, name.find('>'));
+        if (!BookmarkName.empty() && IsQuote(BookmarkName.back()))
+            BookmarkName.pop_back();
         return;
     }
 }
@@ -114,7 +115,7 @@ ResultCode CFormHTMLControlDef::ParseHTML2(std::string_view vstrBuf, const std::
     // Further attributes stand behind a blank.
     if (const std::size_t blank = anchor.name.find(' '); blank != std::string::npos) {
         anchor.name.erase(blank);
-        if (!anchor.name.empty() && anchor.name.back() == '"')
+        if (!anchor.name.empty() && IsQuote(anchor.name.back()))
             anchor.name.pop_back();
     }
     if (anchor.name.empty())

@@ -39,9 +39,9 @@ std::string Cleaned(std::string_view value) {
     if (!cleaned.empty() && cleaned.back() == '/')
         cleaned.pop_back();
     cleaned = text::TrimWhitespace(cleaned);
-    if (!cleaned.empty() && cleaned.front() == '"')
+    if (!cleaned.empty() && IsQuote(cleaned.front()))
         cleaned.erase(0, 1);
-    if (!cleaned.empty() && cleaned.back() == '"')
+    if (!cleaned.empty() && IsQuote(cleaned.back()))
         cleaned.pop_back();
     return cleaned;
 }

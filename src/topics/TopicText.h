@@ -11,6 +11,10 @@ namespace tovimar {
 
 /// Byte position at or behind `from`; npos when absent.
 std::size_t FindAscii(std::string_view text, std::string_view needle, std::size_t from = 0);
+/// Either kind around an attribute's value.
+constexpr bool IsQuote(char c) {
+    return c == '"' || c == '\'';
+}
 bool EqualsAscii(std::string_view left, std::string_view right);
 bool StartsWithAscii(std::string_view text, std::string_view prefix);
 

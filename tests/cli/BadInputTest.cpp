@@ -100,7 +100,8 @@ TEST_F(BadInputTest, AnEventWithoutItsProcedureIsToldAndTheTopicIsMade) {
     const std::string button =
         ControlExport("CommandButton", "Go", "                    OnClick =\"[Event Procedure]\"\r\n");
     Write("app/forms/One.form", FormExport("One", button) + "CodeBehindForm\r\nOption Explicit\r\n");
-    Generate("app").ExpectExit(1).ExpectErrorsHold("tovimar: error: Error 35: Sub or Function not defined\n");
+    Generate("app").ExpectExit(1).ExpectErrorsHold(
+        "tovimar: error: Error 35: Sub or Function not defined: Go_Click in Form_One\n");
     EXPECT_THAT(Pages(), ::testing::ElementsAre("app_Form_One.htm"));
 }
 

@@ -70,6 +70,12 @@ TEST_F(RecompileTest, CompilesAndCopies) {
             "               <SIZE> MB, compiled in <TIME> seconds\nCopied to:     <FOLDER>/copies/shop.chm\n"
             "Web help:      <FOLDER>/help/main.htm\nProject:       <FOLDER>/help/shop.tvp\n");
     EXPECT_EQ(ReadWhole(Folder() / "copies/shop.chm"), Page("shop.chm"));
+    Write("help/shop_Form_Orders.htm",
+          text::ReplaceAll(Page("shop_Form_Orders.htm"), "</body>", "<a href=\"none.htm\">x</a></body>"));
+    Run({"recompile", "help"})
+        .ExpectExit(0)
+        .ExpectErrorsHold("The help compiler has 1 warning; --verbose shows it.\n");
+    Run({"recompile", "help", "--verbose"}).ExpectExit(0).ExpectErrorsHold("'none.htm' isn't on the disk");
     UseViewer();
     Run({"recompile", "help", "--open"}).ExpectExit(0);
     EXPECT_EQ(Shown(), "--show <FOLDER>/help/shop.chm\n");

@@ -40,6 +40,11 @@ TEST_F(TreeTest, OperationsAreSavedTogetherOrNotAtAll) {
             "  Name it by its titles (\"Forms/Orders\"), its page, or the number that \"tovimar contents "
             "--numbers\" shows.\n");
     EXPECT_EQ(ReadWhole(Folder() / "help/shop.tvp"), before);
+    Run({"tree", "help", "skip", "Forms/Search"}).ExpectExit(0);
+    EXPECT_THAT(Run({"tree", "help"}).ExpectExit(0).output,
+                AllOf(HasSubstr("    1.1  Search       shop_Form_Search.htm  (left out)\n"),
+                      HasSubstr("    3.1  Orders       shop_Form_Orders.htm\n"), Not(HasSubstr("#"))));
+    Run({"tree", "help", "unskip", "Forms/Search"}).ExpectExit(0);
     Run({"tree", "help", "wiggle", "Forms"}).ExpectExit(2);
     Run({"tree", "help", "delete", "Forms/First steps", "--delete-page"}).ExpectExit(0);
     EXPECT_FALSE(fs::exists(Folder() / "help/First_steps.htm"));
@@ -106,6 +111,9 @@ TEST_F(TreeTest, IndexEntriesOfObjectsAndPages) {
     const auto project = [this] { return ReadWhole(Folder() / "help/shop.tvp"); };
     Run({"tree", "help", "index", "Forms/Orders", "Orders"}).ExpectExit(0);
     const auto plain = project();
+    fs::remove(Folder() / "help/z1_shop.tvp.bak");
+    EXPECT_EQ(index("Forms/Orders"), "Orders\n");
+    EXPECT_FALSE(fs::exists(Folder() / "help/z1_shop.tvp.bak")) << "a look needs no backup";
     Run({"tree", "help", "index", "Forms/Orders", "Purchases", "pur;chases", "Late \"ones\""}).ExpectExit(0);
     EXPECT_EQ(index("Forms/Orders"), "Purchases\nLate ones\n");
     EXPECT_THAT(definition(), HasSubstr("Purchases|Late ones"));
@@ -113,9 +121,33 @@ TEST_F(TreeTest, IndexEntriesOfObjectsAndPages) {
     Run({"tree", "help", "index", "Forms", "All windows"}).ExpectExit(0);
     EXPECT_EQ(index("Forms"), "All windows\n");
     EXPECT_THAT(project(), HasSubstr("All windows"));
+    Run({"tree", "help", "index", "Forms", ";"})
+        .ExpectExit(1)
+        .ExpectErrors("tovimar: error: 'Forms' keeps its index entries: it needs one at least\n");
     Run({"recompile", "help"});
     EXPECT_THAT(ReadWhole(Folder() / "help/shop.hhk"),
                 AllOf(HasSubstr("All windows"), HasSubstr("Purchases")));
+}
+
+TEST_F(TreeTest, AnotherApplicationIsRefused) {
+    // A form that was left out from the start names no application.
+    auto project = ReadWhole(Folder() / "help/shop.tvp");
+    const std::string named = "  SourceProjectType = \"MS ACCESS\"  SourceProjectName = \"shop\"";
+    ASSERT_NE(project.find(named), std::string::npos);
+    Write("help/shop.tvp", project.erase(project.find(named), named.size()));
+    Run({"regenerate", "help"}).ExpectExit(0);
+    fs::rename(Folder() / "shop", Folder() / "store");
+    Run({"regenerate", "help", "store"})
+        .ExpectExit(1)
+        .ExpectErrors("Reading store\ntovimar: error: the help was made from the application 'shop', and "
+                      "this is 'store'; "
+                      "nothing was written\n");
+    EXPECT_EQ(ReadWhole(Folder() / "help/shop.tvp"), project);
+    Run({"regenerate", "help"})
+        .ExpectExit(1)
+        .ExpectErrors(
+            "tovimar: error: the application of the project isn't at '<FOLDER>/shop/shop.accdb' any "
+            "more\n  SOURCE, behind the project, names its place.\n");
 }
 
 TEST_F(TreeTest, NewObjectsComeInAndEditedPagesStay) {

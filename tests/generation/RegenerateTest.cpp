@@ -236,9 +236,17 @@ TEST_F(RegenerateTest, ListsThatTheWriterTookOut) {
     // An object whose node went with its list is a new one.
     EXPECT_EQ(reloaded_, "Forms/Orders;Forms/Rsales;Forms/Rstock;");
     EXPECT_THAT(Page("Forms.htm"), HasSubstr("App_Report_Rstock.htm"));
+    WriteFile("help\\App_Form_Orders.htm",
+              text::ReplaceAll(Page("App_Form_Orders.htm"), "</body>", "<p>Mine</p></body>"));
     edit("Forms");
     EXPECT_EQ(Names(Regenerate().added), "Form Orders;Report Rsales;Report Rstock;");
     EXPECT_EQ(reloaded_, "Project/Orders;Project/Rsales;Project/Rstock;");
+    // The page that stood there may be a writer's.
+    std::string kept;
+    for (const auto& name : environment->files->ListFiles(Path("help\\"), "App_Form_Orders_*.htm"))
+        kept += Page(name);
+    EXPECT_THAT(kept, HasSubstr("Mine"));
+    EXPECT_THAT(Page("App_Form_Orders.htm"), Not(HasSubstr("Mine")));
     EXPECT_THAT(Page("Welcome.htm"), HasSubstr("App_Report_Rstock.htm"));
 }
 

@@ -54,6 +54,17 @@ TEST_F(ControlDefsTest, TheVersionChoosesTheReader) {
     EXPECT_EQ(marked, Read(Page("3.5.0.1", all)));              // without a blank the numbers stay
 }
 
+TEST_F(ControlDefsTest, ValuesInSingleQuotes) {
+    const std::string page = "<meta name='HTML-TOVIMAR-FORM-NAME' content='Orders'><meta content='q|y' "
+                             "name='TOVIMAR-TOC-EXCLUDE-LIST'>";
+    const std::string version = "<meta name='TOVIMAR-VERSION' content='2.1.0.48 [x]'/>";
+    EXPECT_EQ("x=X",
+              Read(page + version + "<a name='Orders_x'><h2>X</h2></a><a name='Orders_y'><h2>Y</h2></a>"));
+    EXPECT_EQ("First=One",
+              Read(page + "<!-- + CONTROL [Orders] [First] --><a name='Orders_First'><h2>One</h2></a>"
+                          "<!-- - CONTROL [Orders] [First] -->"));
+}
+
 TEST_F(ControlDefsTest, HeadingsByTheOptionsTagsLessTheExcluded) {
     parameters.ListOfTagsToParseContentsFrom = "h3;H2";
     const std::string body = std::string(kHeadings) + "<h3><a name=\"Orders_d\">D</a></h3><h3>open";
@@ -68,6 +79,8 @@ TEST_F(ControlDefsTest, OneHeading) {
                                 : def.FormName + "|" + def.ControlName + "|" + def.TopicCaption;
     };
     EXPECT_EQ("Orders|a|A", read("<h2><a name=\"Orders_a\" class=\"x y\">A</a></h2>"));
+    EXPECT_EQ("Orders|a|A", read("<h2><a name='Orders_a'>A</a></h2>"));
+    EXPECT_EQ("Orders|a|A", read("<h2><a name='Orders_a' class='x y'>A</a></h2>"));
     EXPECT_EQ("Orders|a|more", read("<h2><a name=\"Orders_a\">A<b>more</b></a></h2>"));
     EXPECT_EQ("Orders|a|???", read("<h2><a name=\"Orders_a\"><img src=x></a></h2>"));
     EXPECT_EQ("Orders|a|", read("<h2><a name=\"Orders_a\"></a>A</h2>"));

@@ -122,7 +122,7 @@ const CodeModule::Procedure& CodeModule::Demand(const Arguments& arguments) cons
     for (const auto& procedure : procedures_)
         if (procedure.kind == kind && text::EqualsIgnoringCase(procedure.name, name))
             return procedure;
-    throw RaisedError(kNoSuchProcedure, "Sub or Function not defined", ClassName());
+    throw RaisedError(kNoSuchProcedure, "Sub or Function not defined: " + name + " in " + name_, ClassName());
 }
 
 Value CodeModule::ReadProcCountLines(const Arguments& arguments) {

@@ -8,6 +8,8 @@
 #include <string>
 #include <unordered_map>
 #include <unordered_set>
+#include <utility>
+#include <vector>
 
 namespace tovimar {
 
@@ -16,8 +18,6 @@ namespace {
 constexpr std::size_t kNone = std::string_view::npos;
 constexpr std::size_t kMostBytes = 64U * 1024 * 1024;
 constexpr std::size_t kMostLevels = 2000;
-/// Of elements whose end tags old pages leave out by the thousand.
-constexpr std::size_t kMostLooseLevels = 20000;
 constexpr std::size_t kMostAttributes = 1000;
 
 using Names = std::unordered_set<std::string_view>;
@@ -29,8 +29,21 @@ bool ClosesItself(std::string_view name) {
     return kNames.contains(name);
 }
 
-bool IsLoose(std::string_view name) {
-    static const Names kNames{"li", "dd", "dt", "rb", "rt", "rp", "rtc", "option", "optgroup"};
+/// Parts of lists, whose end tags old pages leave out by the thousand: one ends the one before it if that is
+/// of its family, and the end of the list ends them all.
+enum class Family { None, Item, Definition, Option, Group, Ruby };
+
+Family FamilyOf(std::string_view name) {
+    static const std::unordered_map<std::string_view, Family> kFamilies{
+        {"li", Family::Item},       {"dd", Family::Definition},  {"dt", Family::Definition},
+        {"option", Family::Option}, {"optgroup", Family::Group}, {"rb", Family::Ruby},
+        {"rt", Family::Ruby},       {"rp", Family::Ruby},        {"rtc", Family::Ruby}};
+    const auto family = kFamilies.find(name);
+    return family == kFamilies.end() ? Family::None : family->second;
+}
+
+bool IsList(std::string_view name) {
+    static const Names kNames{"ul", "ol", "dl", "menu", "dir", "select", "ruby"};
     return kNames.contains(name);
 }
 
@@ -56,6 +69,10 @@ private:
     void SkipRawText(const std::string& name);
     void Open(const std::string& name);
     void Close(const std::string& name);
+    void OpenItem(Family family);
+    void CloseItem();
+    void CloseList(const std::string& name);
+    void CheckLevels() const;
     [[noreturn]] static void Refuse(const std::string& reason) {
         throw RaisedError(kFailure1, "The page can't be read: " + reason, "HtmlDocument");
     }
@@ -64,7 +81,14 @@ private:
     std::size_t at_ = 0;
     std::unordered_map<std::string, std::size_t> open_;
     std::size_t levels_ = 0;
-    std::size_t looseLevels_ = 0;
+    struct List {
+        std::string name;
+        std::size_t items;
+        Family last;
+    };
+    std::vector<List> lists_; ///< the open ones, with what was counted before them
+    std::size_t items_ = 0;   ///< levels of list items
+    Family last_ = Family::None;
 };
 
 void Scan::Run() {
@@ -141,18 +165,65 @@ void Scan::SkipRawText(const std::string& name) {
     at_ = kNone;
 }
 
-void Scan::Open(const std::string& name) {
-    ++open_[name];
-    if (IsLoose(name) ? ++looseLevels_ > kMostLooseLevels : ++levels_ > kMostLevels)
+void Scan::CheckLevels() const {
+    if (levels_ + items_ > kMostLevels)
         Refuse("it nests more than 2,000 levels");
 }
 
+void Scan::Open(const std::string& name) {
+    if (const Family family = FamilyOf(name); family != Family::None) {
+        OpenItem(family);
+        return;
+    }
+    ++open_[name];
+    ++levels_;
+    if (IsList(name))
+        lists_.push_back({name, items_, std::exchange(last_, Family::None)});
+    CheckLevels();
+}
+
+void Scan::OpenItem(Family family) {
+    // Outside of their lists these two nest.
+    const bool nests =
+        (family == Family::Ruby && open_["ruby"] == 0) || (family == Family::Group && open_["select"] == 0);
+    if (std::exchange(last_, family) == family && !nests)
+        return;
+    ++items_;
+    CheckLevels();
+}
+
 void Scan::Close(const std::string& name) {
+    if (FamilyOf(name) != Family::None) {
+        CloseItem();
+        return;
+    }
     const auto found = open_.find(name);
     if (found == open_.end() || found->second == 0)
         return;
     --found->second;
-    --(IsLoose(name) ? looseLevels_ : levels_);
+    --levels_;
+    if (IsList(name))
+        CloseList(name);
+}
+
+void Scan::CloseItem() {
+    last_ = Family::None;
+    if (items_ > (lists_.empty() ? 0 : lists_.back().items))
+        --items_;
+}
+
+/// Lists inside it that were left open end with it.
+void Scan::CloseList(const std::string& name) {
+    while (!lists_.empty()) {
+        const List list = std::move(lists_.back());
+        lists_.pop_back();
+        items_ = list.items;
+        last_ = list.last;
+        if (list.name == name)
+            return;
+        --open_[list.name];
+        --levels_;
+    }
 }
 
 } // namespace

@@ -160,7 +160,15 @@ TEST(HtmlDocumentTest, NestedPagesAreBoundedAndNothingRecurses) {
     EXPECT_FALSE(reads(Repeated("<dd><li>", 50000)));
     EXPECT_FALSE(reads("<p " + Repeated("a b='c' ", 2000) + ">"));
     EXPECT_TRUE(reads(Repeated("<div>", 1900)));
+    EXPECT_FALSE(reads(Repeated("<ul><li>", 5000)));
+    EXPECT_FALSE(reads(Repeated("<rt>x", 5000)));
+    EXPECT_FALSE(reads(Repeated("<dl><dd><ol></ol><li>", 5000)));
     EXPECT_TRUE(reads(Repeated("<p>x<li>y<tr><td>", 15000)));
+    // Lists of old pages close nothing but themselves.
+    EXPECT_TRUE(reads("<ul>" + Repeated("<li>x", 50000) + "</ul>"));
+    EXPECT_TRUE(reads(Repeated("<ul><li>x<dl><dt>y<dd>z<ol><li>1<li>2</ol></dl><li>u</ul>", 5000)));
+    EXPECT_TRUE(reads(Repeated("<select><optgroup><option>x<optgroup><option>y</select>", 5000)));
+    EXPECT_TRUE(reads(Repeated("<ruby>x<rb>y<rt>z<rp>u</ruby>", 5000)));
     EXPECT_TRUE(reads(Repeated("<div title='>' x></div><br/><!--><b></b>", 3000)));
 
     HtmlDocument document("<div></div>");
