@@ -119,12 +119,16 @@ void MeasureSample(const fs::path& work) {
     const fs::path application = fs::path(TOVIMAR_SOURCE_DIR) / "../shared/corpus/sports-admin";
     if (!fs::exists(application))
         return;
+    setenv("TOVIMAR_INSTALL", (fs::path(TOVIMAR_SOURCE_DIR) / "install").c_str(), 0);
     setenv("XDG_DATA_HOME", (work / "data").c_str(), 1);
     setenv("XDG_CONFIG_HOME", (work / "config").c_str(), 1);
     const fs::path help = work / "help";
     RunProgram({TOVIMAR_PROGRAM, "generate", fs::canonical(application).string(), "--output", help.string(),
                 "--copy-to", work.string(), "--no-compile"});
-    Measure("sports-admin", help / "sports-admin.hhp");
+    if (fs::exists(help / "sports-admin.hhp"))
+        Measure("sports-admin", help / "sports-admin.hhp");
+    else
+        std::puts("sports-admin: no help was written");
 }
 
 } // namespace

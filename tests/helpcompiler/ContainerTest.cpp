@@ -77,6 +77,24 @@ TEST(ContainerTest, HoldsThousandsOfNames) {
         EXPECT_EQ(folder.Read("out" + nameOf(i)), std::to_string(i));
 }
 
+/// A chunk of the directory holds few names of 260 characters, so the chunks stand in many levels.
+TEST(ContainerTest, HoldsFiftyThousandLongNames) {
+    const Folder folder;
+    Container container(0x409, 0);
+    const auto nameOf = [](int i) {
+        const std::string number = std::to_string(i);
+        return "/" + std::string(150, 'd') + "/" + number + std::string(109 - number.size(), 'n');
+    };
+    for (int i = 0; i < 50000; ++i)
+        ASSERT_TRUE(container.Add(nameOf(i), i % 3 == 0 ? "" : std::to_string(i)));
+    folder.Write("many.chm", container.Finish());
+    ASSERT_TRUE(folder.Run("7z t many.chm")) << folder.Read("printed");
+    EXPECT_NE(folder.Read("printed").find("Files: 50000"), std::string::npos) << folder.Read("printed");
+    ASSERT_TRUE(folder.Run("7z x -r -oout many.chm '*99nnn*'"));
+    for (const int i : {1099, 25099, 49999})
+        EXPECT_EQ(folder.Read("out" + nameOf(i)), i % 3 == 0 ? "" : std::to_string(i));
+}
+
 TEST(ContainerTest, IsTheSameOnAnyNumberOfThreads) {
     std::string last;
     for (const unsigned threads : {1U, 2U, 7U}) {
