@@ -6,6 +6,7 @@
 // less what a process has that reads nothing.
 
 #include "ChildRun.h"
+#include "platform/Memory.h"
 #include "platform/access/database/DatabaseDesigns.h"
 
 #include <unistd.h>
@@ -80,6 +81,7 @@ void Measure(const std::string& file) {
 } // namespace
 
 int main(int count, char** arguments) {
+    tovimar::platform::KeepFreedMemory(); // as the program does
     std::vector<std::string> files(arguments + 1, arguments + count);
     const fs::path corpus = TOVIMAR_SOURCE_DIR "/../shared/corpus/access-forms";
     if (files.empty() && fs::exists(corpus))

@@ -129,6 +129,8 @@ std::string RunGuarded(const std::string& nativePath, const std::function<std::s
     int ends[2] = {-1, -1};
     if (::pipe2(ends, O_CLOEXEC) != 0)
         throw RaisedError(kFailure1, nativePath + ": no pipe for reading the database.", "DatabaseReader");
+    // The two processes wait for each other less often; without it they only take longer.
+    ::fcntl(ends[1], F_SETPIPE_SZ, 1 << 20);
     Descriptor reading(ends[0]);
     Descriptor writing(ends[1]);
     const auto child = ::fork();

@@ -144,8 +144,13 @@ std::string CodePage::Decode(std::string_view bytes) const {
         return DecodeMultiByte(table_->converter.get(), bytes);
     std::string out;
     out.reserve(bytes.size());
-    for (const char byte : bytes)
-        AppendCodePoint(out, table_->toUnicode[static_cast<std::uint8_t>(byte)]);
+    for (const char byte : bytes) {
+        const char32_t codePoint = table_->toUnicode[static_cast<std::uint8_t>(byte)];
+        if (codePoint < 0x80)
+            out += static_cast<char>(codePoint);
+        else
+            AppendCodePoint(out, codePoint);
+    }
     return out;
 }
 

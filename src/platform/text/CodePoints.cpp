@@ -83,6 +83,10 @@ std::u16string ToUtf16(std::string_view text) {
     std::u16string out;
     out.reserve(text.size());
     for (std::size_t i = 0; i < text.size();) {
+        if (static_cast<unsigned char>(text[i]) < 0x80) {
+            out += static_cast<char16_t>(text[i++]);
+            continue;
+        }
         const char32_t codePoint = NextCodePoint(text, i);
         if (codePoint < 0x10000) {
             out += static_cast<char16_t>(codePoint);
@@ -99,7 +103,9 @@ std::string FromUtf16(std::u16string_view text) {
     out.reserve(text.size());
     for (std::size_t i = 0; i < text.size(); ++i) {
         const char32_t unit = text[i];
-        if (U16_IS_LEAD(unit) && i + 1 < text.size() && U16_IS_TRAIL(text[i + 1])) {
+        if (unit < 0x80) {
+            out += static_cast<char>(unit);
+        } else if (U16_IS_LEAD(unit) && i + 1 < text.size() && U16_IS_TRAIL(text[i + 1])) {
             AppendCodePoint(out, static_cast<char32_t>(U16_GET_SUPPLEMENTARY(unit, text[i + 1])));
             ++i;
         } else {

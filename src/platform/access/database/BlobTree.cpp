@@ -113,10 +113,11 @@ bool IsNoPicture(const DesignRecord& record) {
 
 /// The number of the help file was met in no design at hand, but nothing else of a form is the name of one.
 bool IsHelpFile(const BlobObject& object, const DesignRecord& record, const PropertyValue& value) {
-    const bool isRoot = object.type == ObjectTypeNumber("Form") || object.type == ObjectTypeNumber("Report");
-    const auto name = text::ToLower(value.text);
+    static const auto kForm = ObjectTypeNumber("Form");
+    static const auto kReport = ObjectTypeNumber("Report");
+    const bool isRoot = object.type == kForm || object.type == kReport;
     return isRoot && value.form == Form::Text && !IsKnownProperty(record.code) &&
-           (name.ends_with(".chm") || name.ends_with(".hlp"));
+           (text::EndsWithIgnoringCase(value.text, ".chm") || text::EndsWithIgnoringCase(value.text, ".hlp"));
 }
 
 std::unique_ptr<DesignObject> Convert(const BlobObject& source) {
